@@ -1,0 +1,35 @@
+# Shared shell helpers for the project's scripts.
+
+# Installs the named Debian packages that are missing (as root), or names them
+# and stops (as any other user).
+ensure_packages() {
+    local missing=()
+    local pkg
+    for pkg in "$@"; do
+        if ! dpkg-query -W -f='${Status}' "$pkg" 2>/dev/null | grep -q "install ok installed"; then
+            missing+=("$pkg")
+        fi
+    done
+    if [ ${#missing[@]} -eq 0 ]; then
+        return 0
+    fi
+    if [ "$(id -u)" -ne 0 ]; then
+        echo "missing Debian packages: ${missing[*]}" >&2
+        echo "install them with: sudo apt-get install ${missing[*]}" >&2
+        exit 1
+    fi
+    echo "installing Debian packages: ${missing[*]}"
+    if [ -z "${REDAVUDEVA_APT_UPDATED:-}" ]; then
+        apt-get update -qq
+        export REDAVUDEVA_APT_UPDATED=1
+    fi
+    DEBIAN_FRONTEND=noninteractive apt-get install -y -qq --no-install-recommends "${missing[@]}" >/dev/null
+}
+
+# Packages every build needs.
+BUILD_PACKAGES=(cmake ninja-build g++ clang libgtest-dev libbenchmark-dev liblcms2-dev)
+
+section() {
+    echo
+    echo "==== $* ===="
+}

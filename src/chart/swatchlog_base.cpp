@@ -1,0 +1,1 @@
+#include "redavudeva/swatchlog_base.h"

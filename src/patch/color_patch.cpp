@@ -1,0 +1,1 @@
+#include "redavudeva/color_patch.h"
