@@ -36,6 +36,9 @@ public:
                 std::string label);
     CColorPatch(const CColorPatch& other);
     CColorPatch& operator=(const CColorPatch& other);
+    /// Moves take over the label and both maps instead of copying them.
+    CColorPatch(CColorPatch&& other) noexcept;
+    CColorPatch& operator=(CColorPatch&& other) noexcept;
     ~CColorPatch();
 
     // Record accessors; each returns a copy.

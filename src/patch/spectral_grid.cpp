@@ -1,0 +1,93 @@
+// CColorPatch: laying the spectral map out on its wavelength grid.
+#include <array>
+#include <cstddef>
+#include <cstdint>
+#include <limits>
+#include <stdexcept>
+#include <string>
+
+#include "patch/text_number.h"
+#include "redavudeva/color_patch.h"
+
+namespace {
+
+// Lead-ins and trailers that surround the wavelength in a spectral field name,
+// tried in this order ("SPECTRAL_NM_380", "SPECTRAL_380", "380NM").
+constexpr std::array<const char*, 3> kWavelengthMarkers{"SPECTRAL_NM_", "SPECTRAL_", "NM"};
+
+constexpr std::size_t kGridCapacity = sizeof(SpectralDataStruct::values) / sizeof(double);
+
+// The first marker that occurs anywhere in `key`; out_of_range when none does.
+std::string ChooseMarker(const std::string& key) {
+    for (const char* marker : kWavelengthMarkers) {
+        if (key.find(marker) != std::string::npos) {
+            return marker;
+        }
+    }
+    throw std::out_of_range("invalid string position");
+}
+
+// The wavelength named by `key`: the key with the first occurrence of `marker`
+// removed, read as a decimal integer. Throws out_of_range("invalid string
+// position") when the marker is absent, and the number reader's invalid_argument
+// or out_of_range when no digits follow or the number is too large.
+int WavelengthOf(const std::string& key, const std::string& marker) {
+    const std::size_t at = key.find(marker);
+    if (at == std::string::npos) {
+        throw std::out_of_range("invalid string position");
+    }
+    std::string rest = key;
+    rest.erase(at, marker.size());
+    return text_number::ParseLongStrict(rest);
+}
+
+// (greatest - least) / (count - 1), truncated toward zero; 0 for a single value,
+// where no step can be derived. Worked in 64 bits and clamped so that extreme
+// wavelengths in malformed names cannot overflow.
+int StepBetween(int least, int greatest, int count) {
+    if (count < 2) {
+        return 0;
+    }
+    const std::int64_t step = (std::int64_t{greatest} - least) / (count - 1);
+    if (step > std::numeric_limits<int>::max()) {
+        return std::numeric_limits<int>::max();
+    }
+    if (step < std::numeric_limits<int>::min()) {
+        return std::numeric_limits<int>::min();
+    }
+    return static_cast<int>(step);
+}
+
+} // namespace
+
+// Values are taken in ascending key order; at most the first 50 fit the grid and
+// the rest are dropped, so the grid's greatest wavelength is that of the last
+// value kept. The patch is changed only when every kept name could be read.
+void CColorPatch::SetSpectralDataStruct() {
+    if (m_spectralData.empty()) {
+        return;
+    }
+    SpectralDataStruct grid;
+    const std::string* leastKey = nullptr;
+    const std::string* greatestKey = nullptr;
+    for (const auto& entry : m_spectralData) {
+        if (static_cast<std::size_t>(grid.count) == kGridCapacity) {
+            break;
+        }
+        grid.values[grid.count] = entry.second;
+        ++grid.count;
+        if (leastKey == nullptr) {
+            leastKey = &entry.first;
+        }
+        greatestKey = &entry.first;
+    }
+
+    const std::string marker = ChooseMarker(*greatestKey);
+    const int greatestNm = WavelengthOf(*greatestKey, marker);
+    const int leastNm = WavelengthOf(*leastKey, marker);
+    grid.startNm = leastNm;
+    grid.stepNm = StepBetween(leastNm, greatestNm, grid.count);
+
+    m_spectral = grid;
+    m_bSpectral = true;
+}
