@@ -5,12 +5,13 @@
 #pragma once
 
 #include <cstdint>
-#include <fstream>
 #include <map>
 #include <string>
+#include <string_view>
 #include <utility>
 #include <vector>
 
+#include "it8/read/chart_line_reader.h"
 #include "redavudeva/swatchlog_base.h"
 
 class CIT8ReaderWriter : public CSwatchlogBase {
@@ -52,15 +53,22 @@ public:
 
     // ---- reading (src/it8/read/) -------------------------------------------
 private:
+    /// Empties the chart store, the column maps and the captured lines.
     void ResetReaderState();
+    /// The header loop over the whole text: 0, 5, 6, 7, 8 or 9.
     int ParseChartText();
-    void StoreKeywordLine(const std::vector<std::string>& tokens);
+    /// First token as key, the others each followed by one blank as value.
+    void StoreKeywordLine(const std::vector<std::string_view>& tokens);
+    /// Stores a keyword line and answers its value read as a whole number.
+    int StoreNumericKeywordLine(const std::vector<std::string_view>& tokens);
     void ReadDeviceControlSequence();
-    void SkipSection(const char* endKeyword);
+    void SkipSection(std::string_view endKeyword);
+    /// Field names to column maps: 0, 1 (no END_DATA_FORMAT) or 5 (field count).
     int ReadDataFormat();
+    /// Data rows to numbered patches: 0, 7 or 8.
     int ReadDataRows();
 
-    std::ifstream chartStream;
+    it8::ChartLineReader chartStream; // the file's text, held only while it is read
     std::map<std::string, int> fieldColumns;
     std::map<std::string, int> spectralColumns;
     std::map<std::string, int> nColorColumns;
@@ -68,12 +76,19 @@ private:
     std::vector<std::string> processColorIds;
     std::string dataFormatLine;
     bool crLineEnds = false;
+    std::uint32_t lastRowMask = 0; // missing-space mask of the last data row built
 
     // ---- writing (src/it8/write/) ------------------------------------------
 private:
+    /// A chart file from the value lists alone: 0, 23 (not written) or 24 (a list
+    /// shorter than the set count, or spectra / n-colour maps that differ).
     int WriteNewChartFile(const std::wstring& targetPath);
+    /// Number of columns the value lists yield; the set count goes to `setCount`.
     std::uint32_t CountDataFields(std::uint32_t& setCount);
+    /// The field names between BEGIN_DATA_FORMAT and END_DATA_FORMAT.
     std::string FormatDataFormatLine();
+    /// One data row per set; every non-empty list must hold `setCount` entries.
     void AppendDataRows(std::vector<std::string>& lines, std::uint32_t setCount);
+    /// The template's lines with the store's columns appended: 0, 21, 23, 24.
     int AppendColumnsToFile(const std::wstring& templatePath, const std::wstring& targetPath);
 };
