@@ -27,7 +27,7 @@ ensure_packages() {
 }
 
 # Packages every build needs.
-BUILD_PACKAGES=(cmake ninja-build g++ clang libgtest-dev libbenchmark-dev liblcms2-dev)
+BUILD_PACKAGES=(cmake ninja-build g++ clang libgtest-dev libbenchmark-dev liblcms2-dev jq python3)
 
 section() {
     echo

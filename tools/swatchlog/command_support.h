@@ -1,0 +1,42 @@
+// Pieces every command uses: argument checks, output formats, output files.
+#pragma once
+
+#include <functional>
+#include <string>
+#include <vector>
+
+#include "arguments.h"
+#include "text_table.h"
+
+namespace swatchlog {
+
+/// UsageError unless the number of positionals lies within [minimum, maximum].
+void RequirePositionals(const ParsedArguments& parsed, std::size_t minimum, std::size_t maximum,
+                        const std::string& expected);
+
+/// The -o path; UsageError when it is missing or names one of the inputs.
+std::string RequireOutputPath(const ParsedArguments& parsed,
+                              const std::vector<std::string>& inputs);
+
+/// Parses --format for commands with table, tsv, csv (as allowed) and json.
+struct OutputFormat {
+    bool json = false;
+    TableFormat table = TableFormat::Table;
+};
+OutputFormat ParseFormat(const ParsedArguments& parsed, const std::vector<std::string>& allowed);
+
+using WriteFunction = std::function<int(const std::wstring& temporaryPath)>;
+/// Turns a non-zero result code of a writer into the error message.
+using FailureText = std::function<std::string(int code)>;
+
+/// The usual failure text: "FILE: reason [code N]", naming `sourcePath` for the
+/// codes that blame the source file (21, 22) and `outputPath` for the others.
+FailureText DefaultFailureText(const std::string& outputPath, const std::string& sourcePath);
+
+/// Writes `outputPath` whole or not at all: `write` gets a temporary path and
+/// answers the library's result code; a non-zero code, an exception or a
+/// failed rename throw ChartError and leave no trace of the output.
+void WriteOutputFile(const std::string& outputPath, const FailureText& failure,
+                     const WriteFunction& write);
+
+} // namespace swatchlog

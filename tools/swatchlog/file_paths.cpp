@@ -1,0 +1,75 @@
+#include "file_paths.h"
+
+#include <chrono>
+#include <random>
+#include <system_error>
+
+#include "tool_error.h"
+#include "utf8_text.h"
+
+namespace swatchlog {
+namespace fs = std::filesystem;
+
+fs::path FileSystemPath(const std::string& utf8Path) {
+#if defined(_WIN32)
+    std::wstring wide;
+    WideFromUtf8(utf8Path, wide);
+    return fs::path(wide);
+#else
+    return fs::path(utf8Path);
+#endif
+}
+
+std::wstring LibraryPath(const std::string& utf8Path) {
+    std::wstring wide;
+    if (!WideFromUtf8(utf8Path, wide)) {
+        throw ChartError(RepairUtf8(utf8Path) + ": the file name is not valid UTF-8");
+    }
+    return wide;
+}
+
+bool SameFile(const std::string& first, const std::string& second) {
+    std::error_code ec;
+    const fs::path a = FileSystemPath(first);
+    const fs::path b = FileSystemPath(second);
+    if (fs::exists(a, ec) && fs::exists(b, ec)) {
+        const bool same = fs::equivalent(a, b, ec);
+        return !ec && same;
+    }
+    const fs::path normalA = fs::weakly_canonical(fs::absolute(a, ec), ec);
+    const fs::path normalB = fs::weakly_canonical(fs::absolute(b, ec), ec);
+    return normalA == normalB;
+}
+
+PendingOutput::PendingOutput(std::string finalPath) : final_(std::move(finalPath)) {
+    const fs::path target = FileSystemPath(final_);
+    std::error_code ec;
+    if (fs::is_directory(target, ec)) {
+        throw ChartError(final_ + ": is a folder, not a file");
+    }
+    std::random_device random;
+    const auto stamp = std::chrono::steady_clock::now().time_since_epoch().count();
+    const std::string name = target.filename().u8string();
+    const std::string suffix =
+        ".swatchlog-" + std::to_string(random()) + "-" + std::to_string(stamp) + ".tmp";
+    const fs::path parent = target.parent_path();
+    temporary_ = (parent.empty() ? std::string() : parent.u8string() + "/") + "." + name + suffix;
+}
+
+PendingOutput::~PendingOutput() {
+    if (!committed_) {
+        std::error_code ec;
+        fs::remove(FileSystemPath(temporary_), ec);
+    }
+}
+
+void PendingOutput::Commit() {
+    std::error_code ec;
+    fs::rename(FileSystemPath(temporary_), FileSystemPath(final_), ec);
+    if (ec) {
+        throw ChartError(final_ + ": cannot be written (" + ec.message() + ")");
+    }
+    committed_ = true;
+}
+
+} // namespace swatchlog

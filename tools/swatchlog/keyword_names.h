@@ -1,0 +1,22 @@
+// Header keywords: which ones CGATS.17 knows (others need a KEYWORD line) and
+// how a value given on the command line is written.
+#pragma once
+
+#include <string>
+
+namespace swatchlog {
+
+/// Whether `keyword` is one of the format's own header keywords.
+bool IsStandardKeyword(const std::string& keyword);
+/// Whether `keyword` is a structural line (data format, data block, counts)
+/// that must not be inserted as a keyword.
+bool IsStructuralKeyword(const std::string& keyword);
+/// Whether `keyword` can stand as a keyword: letters, digits and underscores,
+/// beginning with a letter.
+bool IsValidKeywordName(const std::string& keyword);
+/// A value as written: numbers and quoted texts as they are, other texts in
+/// double quotes. Empty when the value cannot be written (line breaks, or
+/// double quotes inside it).
+std::string KeywordValueText(const std::string& value, bool& ok);
+
+} // namespace swatchlog
