@@ -84,6 +84,17 @@ TEST(ChannelRamps, StepsOfAHundredthOrLessAreThinnedFromTheTop) {
     EXPECT_EQ(fine.GetChannelRamps(references, xyz, 0), 0);
     EXPECT_EQ(Channel(references, 0), (std::vector<double>{0}));
     EXPECT_EQ(Samples(xyz), (std::vector<double>{3}));
+
+    // A step of exactly 0.01 (0.01 - 0 is the double 0.01 itself) is thinned;
+    // 0.03 - 0.01 = 0.02 is kept.
+    TestStore edge;
+    Add(edge, 1, 0, 0);
+    Add(edge, 2, 0.01, 0);
+    Add(edge, 3, 0.03, 0);
+    edge.channelCount = 4;
+    EXPECT_EQ(edge.GetChannelRamps(references, xyz, 0), 0);
+    EXPECT_EQ(Channel(references, 0), (std::vector<double>{0, 0.03}));
+    EXPECT_EQ(Samples(xyz), (std::vector<double>{1, 3}));
 }
 
 TEST(ChannelRamps, EqualValuesComeOutInExchangeOrder) {

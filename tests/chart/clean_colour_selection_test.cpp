@@ -52,6 +52,25 @@ TEST(CleanColourSelection, CleanAndWhiteAnswersTrueWhenNothingFound) {
     EXPECT_TRUE(found.empty());
 }
 
+// The store tests with the tolerance 1e-5: a tone of exactly 1e-5 is neither
+// printed (not above) nor unprinted (not below).
+TEST(CleanColourSelection, ToleranceOfOneHundredThousandthIsStrictBothWays) {
+    TestStore store;
+    store.patches[1] = Cmyk(1e-5, 0, 0, 0, {1, 0, 0});   // neither clean nor white
+    store.patches[2] = Cmyk(2e-5, 0, 0, 0, {2, 0, 0});   // clean cyan
+    store.patches[3] = Cmyk(0.5e-5, 0, 0, 0, {3, 0, 0}); // white
+    store.patches[4] = Cmyk(50, 1e-5, 0, 0, {4, 0, 0});  // magenta not below: not clean
+    store.channelCount = 4;
+
+    EXPECT_EQ(SampleNumbers(store.SelectCleanColorPatches()), (std::vector<double>{2}));
+    std::vector<CColorPatch> found;
+    EXPECT_FALSE(store.SelectCleanAndWhitePatches(found, false));
+    EXPECT_EQ(SampleNumbers(found), (std::vector<double>{2, 3}));
+    std::map<int, std::vector<CColorPatch>> groups;
+    EXPECT_EQ(store.GroupCleanColorPatches(groups, 0), 0);
+    EXPECT_EQ(SampleNumbers(groups[0]), (std::vector<double>{3, 2}));
+}
+
 TEST(CleanColourSelection, GroupsLeadWithTheFirstWhite) {
     TestStore store = CyanMagentaChart();
     store.patches[8] = Cmyk(0, 0, 0, 0, {8, 0, 0}); // a second white is left out

@@ -113,6 +113,22 @@ TEST(PresenceFlags, SpectrumAloneImpliesCmykXyzAndLab) {
     EXPECT_EQ(store.missingColorSpaces, kNothingSupplied & ~MISSING_SPECTRAL);
 }
 
+TEST(PresenceFlags, LabFollowsTheXyzFlagOfTheStepBefore) {
+    TestStore xyzOnly; // the patches compute Lab from their XYZ
+    xyzOnly.UpdatePresenceFlags(kNothingSupplied & ~MISSING_XYZ);
+    EXPECT_TRUE(xyzOnly.hasXYZ);
+    EXPECT_TRUE(xyzOnly.hasLAB);
+    EXPECT_FALSE(xyzOnly.hasCMYK);
+    EXPECT_FALSE(xyzOnly.hasSpectral);
+
+    TestStore nothing; // no source for XYZ or Lab
+    nothing.UpdatePresenceFlags(kNothingSupplied);
+    for (int space = -1; space <= 12; ++space) {
+        EXPECT_FALSE(nothing.IsColorSpacePresent(space)) << space;
+    }
+    EXPECT_EQ(nothing.channelCount, 0);
+}
+
 TEST(PresenceFlags, ChannelCountFollowsTheLastDeviceSpaceSupplied) {
     {
         TestStore store; // CMYK and RGB: the RGB step comes later

@@ -36,6 +36,16 @@ std::array<int, 2> NonZeroRange(const SpectralRow& row) {
     return range;
 }
 
+// Sum of (i + 1) * row[i]: unlike the plain sum it changes when two entries
+// trade places, so it checks that each entry stands at its own wavelength.
+double Moment(const SpectralRow& row) {
+    double sum = 0.0;
+    for (std::size_t i = 0; i < row.size(); ++i) {
+        sum += static_cast<double>(i + 1) * row[i];
+    }
+    return sum;
+}
+
 TEST(ColorimetryTables, WeightingSetColumnsAddUpToTheirPublishedSums) {
     struct Expected {
         const colorimetry::WeightingSet* set;
@@ -87,6 +97,41 @@ TEST(ColorimetryTables, DensityFiltersCoverTheirRangesWithTheirEntries) {
     // Sets 2 and 3 share red and green.
     EXPECT_EQ(colorimetry::kDensityFilterSets[2][0], colorimetry::kDensityFilterSets[3][0]);
     EXPECT_EQ(colorimetry::kDensityFilterSets[2][1], colorimetry::kDensityFilterSets[3][1]);
+}
+
+// The moments below were computed by a separate script straight from the
+// published tables (weighting columns, visual weights, filter entries placed at
+// their wavelengths), not from these arrays.
+TEST(ColorimetryTables, EveryEntryStandsAtItsWavelength) {
+    const colorimetry::WeightingSet* sets[4] = {
+        &colorimetry::kD50Observer2, &colorimetry::kD65Observer2, &colorimetry::kD50Observer10,
+        &colorimetry::kD65Observer10};
+    const double weightingMoments[4][3] = {{20884.52294, 20000.99748, 7592.64138},
+                                           {19754.7708, 19736.30428, 9845.47613},
+                                           {22382.00352, 21162.46807, 7840.735049},
+                                           {21303.02636, 21041.94753, 10289.5971}};
+    for (std::size_t set = 0; set < 4; ++set) {
+        for (std::size_t axis = 0; axis < 3; ++axis) {
+            EXPECT_NEAR(Moment((*sets[set])[axis]), weightingMoments[set][axis], 1e-5)
+                << "weighting set " << set << " column " << axis;
+        }
+    }
+    EXPECT_NEAR(Moment(colorimetry::kVisualWeights), 203.2168138, 1e-7);
+
+    const double filterMoments[7][3] = {{1313.895, 617.435, 257.016},
+                                        {1273.474, 915.059, 380.368},
+                                        {1277.043, 998.317, 608.719},
+                                        {1277.043, 998.317, 426.904},
+                                        {38.29949022, 27.90457288, 10.62794414},
+                                        {71.1364, 83.07865, 27.7064},
+                                        {95, 60.8, 22.8}};
+    for (std::size_t set = 0; set < 7; ++set) {
+        for (std::size_t filter = 0; filter < 3; ++filter) {
+            EXPECT_NEAR(Moment(colorimetry::kDensityFilterSets[set][filter]),
+                        filterMoments[set][filter], 1e-7)
+                << "set " << set << " filter " << filter;
+        }
+    }
 }
 
 } // namespace

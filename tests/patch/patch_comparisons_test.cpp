@@ -48,6 +48,8 @@ TEST(PatchComparisons, GradientTestComparesTheLineParameterWithinTolerance) {
     EXPECT_FALSE(CmykPatch({50, 50, 0, 1}).IsCMYKOnGradient({}, direction, 1)); // k off origin
     // Tolerance 1e7 allows a difference of 1 in t and off the origin.
     EXPECT_TRUE(CmykPatch({50, 60, 0, 1}).IsCMYKOnGradient({}, direction, 1e7));
+    EXPECT_FALSE(CmykPatch({50, 65, 0, 0}).IsCMYKOnGradient({}, direction, 1e7)); // 5 vs 6.5
+    EXPECT_FALSE(CmykPatch({50, 50, 0, 1.5}).IsCMYKOnGradient({}, direction, 1e7));
     // A zero direction: on the gradient only at the origin.
     EXPECT_TRUE(CmykPatch({5, 6, 7, 8}).IsCMYKOnGradient({5, 6, 7, 8}, {}, 1));
     EXPECT_FALSE(CmykPatch({5, 6, 7, 8.001}).IsCMYKOnGradient({5, 6, 7, 8}, {}, 1));
