@@ -22,20 +22,21 @@ fs::path ResolveTarget(const fs::path& target) {
     return target;
 }
 
-// A name beside the target that no other writer is likely to pick at the same
-// moment: the target's name with a random lead-out.
+// A short name in the target's folder that no other writer is likely to pick
+// at the same moment. It does not grow with the target's name, so a target
+// whose name is near the file system's limit still gets a temporary file.
 fs::path TemporaryBeside(const fs::path& target) {
     std::random_device random;
     const unsigned long long stamp = (static_cast<unsigned long long>(random()) << 32) ^ random();
-    fs::path temporary = target;
-    temporary += ".tmp" + std::to_string(stamp);
-    return temporary;
+    return target.parent_path() / (".rdv" + std::to_string(stamp) + ".tmp");
 }
 
-bool WriteText(const fs::path& path, const std::vector<std::string>& lines) {
+enum class WriteOutcome { NotOpened, Failed, Written };
+
+WriteOutcome WriteText(const fs::path& path, const std::vector<std::string>& lines) {
     std::ofstream out(path, std::ios::out | std::ios::trunc);
     if (!out.is_open()) {
-        return false;
+        return WriteOutcome::NotOpened;
     }
     for (const std::string& line : lines) {
         out.write(line.data(), static_cast<std::streamsize>(line.size()));
@@ -44,7 +45,17 @@ bool WriteText(const fs::path& path, const std::vector<std::string>& lines) {
     out.flush();
     const bool written = out.good();
     out.close();
-    return written && !out.fail();
+    return written && !out.fail() ? WriteOutcome::Written : WriteOutcome::Failed;
+}
+
+// Writes straight into the target; a target left half written is removed.
+bool WriteInPlace(const fs::path& destination, const std::vector<std::string>& lines) {
+    const WriteOutcome outcome = WriteText(destination, lines);
+    if (outcome == WriteOutcome::Failed) {
+        std::error_code ec;
+        fs::remove(destination, ec);
+    }
+    return outcome == WriteOutcome::Written;
 }
 
 } // namespace
@@ -59,7 +70,7 @@ bool WriteLinesToFile(const fs::path& target, const std::vector<std::string>& li
     if (fs::exists(status) && !fs::is_regular_file(status)) {
         // A device or pipe cannot be replaced by renaming; it is written in place.
         // A folder is no target at all.
-        return !fs::is_directory(status) && WriteText(destination, lines);
+        return !fs::is_directory(status) && WriteText(destination, lines) == WriteOutcome::Written;
     }
     // An existing file keeps its permissions; one that may not be written stays
     // as it is, as opening it for writing would have failed.
@@ -68,19 +79,24 @@ bool WriteLinesToFile(const fs::path& target, const std::vector<std::string>& li
         return false;
     }
     const fs::path temporary = TemporaryBeside(destination);
-    if (!WriteText(temporary, lines)) {
-        fs::remove(temporary, ec);
-        return false;
+    const WriteOutcome outcome = WriteText(temporary, lines);
+    if (outcome == WriteOutcome::Written) {
+        if (replacing) {
+            fs::permissions(temporary, status.permissions(), ec);
+        }
+        fs::rename(temporary, destination, ec);
+        if (!ec) {
+            return true;
+        }
     }
-    if (replacing) {
-        fs::permissions(temporary, status.permissions(), ec);
+    fs::remove(temporary, ec);
+    if (outcome == WriteOutcome::Failed) {
+        return false; // the text does not fit (a full disk): the target stays as it was
     }
-    fs::rename(temporary, destination, ec);
-    if (ec) {
-        fs::remove(temporary, ec);
-        return false;
-    }
-    return true;
+    // The folder takes no new file, or the target cannot be replaced by renaming
+    // (held open elsewhere): the target is written in place, as opening it for
+    // writing does.
+    return WriteInPlace(destination, lines);
 }
 
 } // namespace it8

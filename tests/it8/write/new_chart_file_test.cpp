@@ -13,6 +13,7 @@
 using test_support::ReadBytes;
 using test_support::TempDir;
 using test_support::Wide;
+using test_support::WriteBytes;
 using write_test::FileText;
 using write_test::Source;
 
@@ -149,7 +150,7 @@ TEST(NewChartFile, TargetThatCannotBeWrittenAnswers23) {
     EXPECT_EQ(WriteNew(chart, readOnly), 23);
     EXPECT_EQ(ReadBytes(readOnly), "keep");
     fs::permissions(readOnly, fs::perms::owner_all); // so that the folder can be removed
-#if !defined(_WIN32) // Windows keeps only a read-only attribute
+#if !defined(_WIN32)                                 // Windows keeps only a read-only attribute
     const auto shared = dir.write("shared.txt", "old");
     fs::permissions(shared, fs::perms::owner_read | fs::perms::owner_write | fs::perms::group_read);
     EXPECT_EQ(WriteNew(chart, shared), 0);
@@ -163,6 +164,32 @@ TEST(NewChartFile, TargetThatCannotBeWrittenAnswers23) {
         EXPECT_EQ(WriteNew(chart, "/dev/full"), 23);
     }
 #endif
+}
+
+TEST(NewChartFile, TargetNameNearTheFileSystemLimitIsWritten) {
+    // 244 characters: a valid file name (at most 255 on the usual file systems),
+    // which a writer must create or replace like any other.
+#if defined(_WIN32)
+    GTEST_SKIP() << "the folder and the name together pass the classic Windows path limit";
+#endif
+    TempDir dir;
+    const std::string longName = std::string(240, 'n') + ".txt";
+    const std::string sevenLines =
+        FileText({"IT8", "NUMBER_OF_FIELDS\t0", "BEGIN_DATA_FORMAT", "END_DATA_FORMAT",
+                  "NUMBER_OF_SETS\t0", "BEGIN_DATA", "END_DATA"});
+    CIT8ReaderWriter chart;
+    ASSERT_EQ(WriteNew(chart, dir.file(longName)), 0);
+    EXPECT_EQ(ReadBytes(dir.file(longName)), sevenLines);
+    WriteBytes(dir.file(longName), "old");
+    ASSERT_EQ(WriteNew(chart, dir.file(longName)), 0);
+    EXPECT_EQ(ReadBytes(dir.file(longName)), sevenLines);
+
+    // The other writers share the way out: InsertKeywords on a one-line source.
+    const auto source = dir.write("source.txt", "CGATS.17\n");
+    ASSERT_EQ(chart.InsertKeywords(Wide(source), Wide(dir.file(longName)), {{"K", "v"}}), 0);
+    EXPECT_EQ(ReadBytes(dir.file(longName)), FileText({"CGATS.17", "K\tv"}));
+    // Nothing but the source and the target remains in the folder.
+    EXPECT_EQ(std::distance(std::filesystem::directory_iterator(dir.path()), {}), 2);
 }
 
 TEST(NewChartFile, WrittenChartReadsBackWithTheSameValues) {
