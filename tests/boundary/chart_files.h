@@ -49,13 +49,6 @@ protected:
         lastPath = dir.write(name, text);
         return host->ReadChartFile(test_support::Wide(lastPath));
     }
-    /// Label of a patch that must exist.
-    std::string LabelOf(int sample) {
-        int result = -1;
-        const CColorPatch patch = host->GetPatch(sample, result);
-        EXPECT_EQ(result, 0) << "sample " << sample;
-        return patch.GetLabel();
-    }
 
     test_support::TempDir dir;
     Host host = NewHost();

@@ -42,16 +42,12 @@ std::vector<double> Channel(const std::vector<std::vector<double>>& references, 
 }
 
 std::vector<double> XValues(const std::vector<tagXYZ>& xyz) {
-    std::vector<double> values;
-    for (const tagXYZ& v : xyz) {
-        values.push_back(v.x);
-    }
-    return values;
+    return Channel(ValueRows(xyz), 0);
 }
 
 using HostSelections = HostChart;
 
-TEST_F(HostSelections, GroupsPutTheWhiteFirstAndKeepSampleOrder) {
+TEST_F(HostSelections, CleanPatchesGroupedWithTheWhiteFirstInSampleOrder) {
     ASSERT_EQ(Read(kCmykXyzFields, kCyanMagentaRows), 0);
     std::map<int, std::vector<CColorPatch>> groups{{9, {}}};
     EXPECT_EQ(host->GroupCleanColorPatches(groups, -1), 0);
@@ -70,6 +66,10 @@ TEST_F(HostSelections, GroupsPutTheWhiteFirstAndKeepSampleOrder) {
 
     EXPECT_EQ(Labels(host->SelectCleanColorPatches()),
               (Names{"C100", "C50", "C25", "M100", "M60", "M30"}));
+    // Sample 1 is white and not clean: with stop, the walk ends there.
+    std::vector<CColorPatch> selected;
+    EXPECT_FALSE(host->SelectCleanAndWhitePatches(selected, true));
+    EXPECT_EQ(Labels(selected), (Names{"W"}));
 }
 
 TEST_F(HostSelections, RampsSortedAlongTheChannelWithMatchingXyz) {
@@ -88,32 +88,43 @@ TEST_F(HostSelections, RampsSortedAlongTheChannelWithMatchingXyz) {
     EXPECT_EQ(Channel(references, 1), (std::vector<double>{0, 0, 0, 0, 0, 30, 60, 100, 0, 0}));
     EXPECT_EQ(XValues(xyz), (std::vector<double>{90, 70, 50, 20, 90, 72, 55, 40, 90, 90}));
 
-    for (int channel : {4, -2}) {
-        EXPECT_EQ(host->GetChannelRamps(references, xyz, channel), 19) << channel;
-    }
-    EXPECT_EQ(references.size(), 10u);
-    EXPECT_EQ(xyz.size(), 10u);
+    EXPECT_EQ(host->GetChannelRamps(references, xyz, -2), 19);
+    EXPECT_EQ(references.size() + xyz.size(), 20u); // left alone
 }
 
-TEST_F(HostSelections, RampsDropStepsOfAHundredthOrLess) {
-    // Sorted: 20, 20.02, 50, 50.005. From the top, 50.005 is only 0.005 above 50
-    // and goes; 0.02 is more than a hundredth and stays.
-    ASSERT_EQ(Read(kCmykXyzFields, {"1 A 50.005 0 0 0 1 1 1", "2 B 50.000 0 0 0 2 2 2",
-                                    "3 C 20 0 0 0 3 3 3", "4 D 20.02 0 0 0 4 4 4"}),
-              0);
-    std::vector<std::vector<double>> references;
-    std::vector<tagXYZ> xyz;
-    EXPECT_EQ(host->GetChannelRamps(references, xyz, 0), 0);
-    EXPECT_EQ(Channel(references, 0), (std::vector<double>{20, 20.02, 50}));
-    EXPECT_EQ(XValues(xyz), (std::vector<double>{3, 4, 2}));
-
-    // 0 (white), 0.005 and 0.010: 0.010 - 0.005 goes first, then 0.005 - 0.
-    ASSERT_EQ(Read(kCmykXyzFields,
-                   {"1 W 0 0 0 0 9 9 9", "2 A 0.005 0 0 0 1 1 1", "3 B 0.010 0 0 0 2 2 2"}),
-              0);
-    EXPECT_EQ(host->GetChannelRamps(references, xyz, 0), 0);
-    EXPECT_EQ(Channel(references, 0), (std::vector<double>{0}));
-    EXPECT_EQ(XValues(xyz), (std::vector<double>{9}));
+TEST_F(HostSelections, RampsSortByExchangeAndDropStepsOfAHundredthOrLess) {
+    struct Case {
+        std::vector<std::string> rows; // XYZ x is the sample number
+        std::vector<double> cyan;
+        std::vector<double> samples;
+    };
+    const Case cases[] = {
+        // Sorted 20, 20.02, 50, 50.005: from the top 50.005 is only 0.005 above 50
+        // and goes; 0.02 is more than a hundredth and stays.
+        {{"1 A 50.005 0 0 0 1 1 1", "2 B 50.000 0 0 0 2 2 2", "3 C 20 0 0 0 3 3 3",
+          "4 D 20.02 0 0 0 4 4 4"},
+         {20, 20.02, 50},
+         {3, 4, 2}},
+        // 0 (white), 0.005, 0.010: 0.010 - 0.005 goes first, then 0.005 - 0.
+        {{"1 W 0 0 0 0 1 1 1", "2 A 0.005 0 0 0 2 2 2", "3 B 0.010 0 0 0 3 3 3"}, {0}, {1}},
+        // A step of exactly 0.01 (0.01 - 0 is the double 0.01) goes; 0.02 stays.
+        {{"1 W 0 0 0 0 1 1 1", "2 A 0.01 0 0 0 2 2 2", "3 B 0.03 0 0 0 3 3 3"}, {0, 0.03}, {1, 3}},
+        // Collected as white 5, then 1 (50), 2 (25), 3 (50), 4 (25). The exchange
+        // sort gives 5, 2, 4, 3, 1; thinning drops 1 (equal to 3) and 4 (equal to
+        // 2). A stable sort would have kept 1 instead of 3.
+        {{"1 A 50 0 0 0 1 1 1", "2 B 25 0 0 0 2 2 2", "3 C 50 0 0 0 3 3 3", "4 D 25 0 0 0 4 4 4",
+          "5 W 0 0 0 0 5 5 5"},
+         {0, 25, 50},
+         {5, 2, 3}},
+    };
+    for (const Case& c : cases) {
+        ASSERT_EQ(Read(kCmykXyzFields, c.rows), 0);
+        std::vector<std::vector<double>> references;
+        std::vector<tagXYZ> xyz;
+        EXPECT_EQ(host->GetChannelRamps(references, xyz, 0), 0);
+        EXPECT_EQ(Channel(references, 0), c.cyan) << c.rows[0];
+        EXPECT_EQ(XValues(xyz), c.samples) << c.rows[0];
+    }
 }
 
 TEST_F(HostSelections, OnlyTheFirstOfTwoWhitesIsTaken) {
@@ -138,20 +149,32 @@ TEST_F(HostSelections, OnlyTheFirstOfTwoWhitesIsTaken) {
 }
 
 TEST_F(HostSelections, CleanAndWhiteSelection) {
-    // Sample 1 is white and not clean: with stop, the walk ends there.
-    ASSERT_EQ(Read(kCmykXyzFields, kCyanMagentaRows), 0);
-    std::vector<CColorPatch> selected;
-    EXPECT_FALSE(host->SelectCleanAndWhitePatches(selected, true));
-    EXPECT_EQ(Labels(selected), (Names{"W"}));
-
     // Neither clean nor white: true (nothing found) and an emptied list.
     ASSERT_EQ(Read(kCmykXyzFields, {"1 CM 50 50 0 0 1 1 1", "2 CY 10 0 10 0 2 2 2"}), 0);
+    std::vector<CColorPatch> selected{CColorPatch()};
     EXPECT_TRUE(host->SelectCleanAndWhitePatches(selected, true));
     EXPECT_TRUE(selected.empty());
     EXPECT_TRUE(host->SelectCleanColorPatches().empty());
     std::map<int, std::vector<CColorPatch>> groups;
     EXPECT_EQ(host->GroupCleanColorPatches(groups, -1), 0);
     EXPECT_EQ(GroupLabels(groups), (Groups{{0, {}}, {1, {}}, {2, {}}, {3, {}}}));
+
+    // A tone of exactly 0.00001 is neither printed (not above) nor unprinted (not
+    // below): T is neither clean nor white, M is not clean for its magenta.
+    ASSERT_EQ(Read(kCmykXyzFields, {"1 T 0.00001 0 0 0 1 1 1", "2 C 0.00002 0 0 0 2 2 2",
+                                    "3 W 0.000005 0 0 0 3 3 3", "4 M 50 0.00001 0 0 4 4 4"}),
+              0);
+    EXPECT_EQ(Labels(host->SelectCleanColorPatches()), (Names{"C"}));
+    EXPECT_FALSE(host->SelectCleanAndWhitePatches(selected, false));
+    EXPECT_EQ(Labels(selected), (Names{"C", "W"}));
+    EXPECT_EQ(host->GroupCleanColorPatches(groups, 0), 0);
+    EXPECT_EQ(GroupLabels(groups), (Groups{{0, {"W", "C"}}}));
+
+    // XYZ alone gives no device channels: -1 groups nothing, channel 0 is outside.
+    ASSERT_EQ(Read("SAMPLE_ID XYZ_X XYZ_Y XYZ_Z", {"1 90 95 80"}), 0);
+    EXPECT_EQ(host->GroupCleanColorPatches(groups, 0), 19);
+    EXPECT_EQ(host->GroupCleanColorPatches(groups, -1), 0);
+    EXPECT_TRUE(groups.empty());
 }
 
 TEST_F(HostSelections, ChannelBeyondThePatchReferenceValues) {

@@ -1,5 +1,5 @@
 // XYZ, L*a*b* and densities computed through the colour engine from the spectra
-// a host hands in.
+// a host hands in: the calls the store makes and what it keeps of their answers.
 #include <gtest/gtest.h>
 
 #include "recording_engine.h"
@@ -14,6 +14,9 @@ using Spectra = std::vector<std::map<std::string, double>>;
 class ListColorimetry : public ::testing::Test {
 protected:
     void SetUp() override { engine_double::Reset(); }
+    std::vector<std::size_t> ComputedSizes() const {
+        return {store.xyzList.size(), store.labList.size(), store.densityList.size()};
+    }
     TestStore store;
 };
 
@@ -23,16 +26,11 @@ TEST_F(ListColorimetry, WithoutComputeOnlyTheSpectraChange) {
     store.densityList = {tagDENSITY{}};
     store.SetSpectralDataList({Spectrum("SPECTRAL_NM_", 380, 730, 10)}, false);
     EXPECT_EQ(store.spectralList.size(), 1u);
-    EXPECT_EQ(store.xyzList.size(), 1u);
-    EXPECT_EQ(store.labList.size(), 1u);
-    EXPECT_EQ(store.densityList.size(), 1u);
-    EXPECT_TRUE(engine_double::Calls().empty());
+    EXPECT_EQ(ComputedSizes(), (std::vector<std::size_t>{1, 1, 1}));
 
-    store.SetSpectralDataList({}, true);
+    store.SetSpectralDataList({}, true); // an empty list empties the computed ones
     EXPECT_TRUE(store.spectralList.empty());
-    EXPECT_TRUE(store.xyzList.empty());
-    EXPECT_TRUE(store.labList.empty());
-    EXPECT_TRUE(store.densityList.empty());
+    EXPECT_EQ(ComputedSizes(), (std::vector<std::size_t>{0, 0, 0}));
     EXPECT_TRUE(engine_double::Calls().empty());
 }
 
@@ -53,58 +51,54 @@ TEST_F(ListColorimetry, ThreeSpectraGiveThreeEntriesThroughThreeCallsEach) {
         const auto& toXyz = calls[3 * s];
         const auto& toLab = calls[3 * s + 1];
         const auto& toDensity = calls[3 * s + 2];
-        EXPECT_EQ(toXyz.call, Call::SpectralToXYZ);
-        EXPECT_EQ(toXyz.startNm, 380);
-        EXPECT_EQ(toXyz.count, 36);
-        ASSERT_EQ(toXyz.input.size(), 36u);
-        EXPECT_EQ(toXyz.input[35], static_cast<float>(values[s]));
-        EXPECT_EQ(toLab.call, Call::XYZToLab);
-        ASSERT_EQ(toLab.input.size(), 3u);
-        EXPECT_FLOAT_EQ(toLab.input[0], 0.41f); // 41 / 100
-        EXPECT_FLOAT_EQ(toLab.input[2], 0.43f);
-        EXPECT_EQ(toDensity.call, Call::SpectralToDensity);
-        EXPECT_EQ(toDensity.startNm, 380);
-        EXPECT_EQ(toDensity.count, 36);
-        EXPECT_EQ(toDensity.option, 0);
+        EXPECT_EQ(
+            (std::vector<Call>{toXyz.call, toLab.call, toDensity.call}),
+            (std::vector<Call>{Call::SpectralToXYZ, Call::XYZToLab, Call::SpectralToDensity}));
+        // Start, count and option of the two spectral calls.
+        EXPECT_EQ((std::vector<int>{toXyz.startNm, toXyz.count, toDensity.startNm, toDensity.count,
+                                    toDensity.option}),
+                  (std::vector<int>{380, 36, 380, 36, 0}));
+        EXPECT_EQ(toXyz.input, std::vector<float>(36, static_cast<float>(values[s])));
         EXPECT_EQ(toDensity.input, toXyz.input);
+        ASSERT_EQ(toLab.input.size(), 3u);
+        for (int i = 0; i < 3; ++i) {
+            EXPECT_FLOAT_EQ(toLab.input[i], (41.0f + i) / 100); // the engine's XYZ / 100
+        }
     }
-    ASSERT_EQ(store.xyzList.size(), 3u);
-    ASSERT_EQ(store.labList.size(), 3u);
-    ASSERT_EQ(store.densityList.size(), 3u);
+    ASSERT_EQ(ComputedSizes(), (std::vector<std::size_t>{3, 3, 3}));
     EXPECT_EQ(store.xyzList[2].y, 42.0);
     EXPECT_EQ(store.labList[1].b, 3.5);
-    EXPECT_EQ(store.densityList[0].red, 0.5);
-    EXPECT_EQ(store.densityList[0].green, 0.25);
-    EXPECT_EQ(store.densityList[0].blue, 1.5);
-    EXPECT_EQ(store.densityList[0].visual, 2.0);
-    for (const auto& density : store.densityList) {
-        EXPECT_EQ(density.majorFilter, 0.0);
-    }
+    const tagDENSITY& density = store.densityList[0];
+    EXPECT_EQ((std::vector<double>{density.red, density.green, density.blue, density.visual,
+                                   density.majorFilter}),
+              (std::vector<double>{0.5, 0.25, 1.5, 2.0, 0.0}));
 }
 
-TEST_F(ListColorimetry, StartWavelengthFromEveryLeadIn) {
-    for (const char* leadIn : {"SPECTRAL_", "nm", "NM"}) {
+TEST_F(ListColorimetry, StartWavelengthFromTheFirstName) {
+    const struct {
+        std::map<std::string, double> first;
+        int calls;
+        int startNm;
+    } cases[] = {
+        {Spectrum("SPECTRAL_", 400, 700, 10), 3, 400},
+        {Spectrum("nm", 400, 700, 10), 3, 400},
+        {Spectrum("NM", 400, 700, 10), 3, 400},
+        {{{"SPECTRAL_x", 0.5}, {"SPECTRAL_y", 0.6}}, 3, 0}, // no digit: 0, still computed
+        {{{"R380", 0.5}}, 0, 0},                            // no lead-in: nothing computed
+        {{}, 0, 0},                                         // empty first spectrum
+    };
+    for (const auto& c : cases) {
         engine_double::Reset();
-        store.SetSpectralDataList({Spectrum(leadIn, 400, 700, 10)}, true);
-        ASSERT_FALSE(engine_double::Calls().empty()) << leadIn;
-        EXPECT_EQ(engine_double::Calls()[0].startNm, 400) << leadIn;
-        EXPECT_EQ(engine_double::Calls()[0].count, 31) << leadIn;
-        EXPECT_EQ(store.xyzList.size(), 1u) << leadIn;
+        store.SetSpectralDataList({c.first, Spectrum("SPECTRAL_", 380, 730, 10)}, true);
+        const auto& calls = engine_double::Calls();
+        ASSERT_EQ(calls.size(), static_cast<std::size_t>(2 * c.calls)) << c.calls;
+        if (c.calls > 0) {
+            EXPECT_EQ(calls[0].startNm, c.startNm);
+            EXPECT_EQ(calls[0].count, static_cast<int>(c.first.size()));
+        }
+        EXPECT_EQ(store.spectralList.size(), 2u);
+        EXPECT_EQ(store.xyzList.size(), c.calls == 0 ? 0u : 2u);
     }
-    // No digit after the lead-in reads as 0 and is still handed to the engine.
-    engine_double::Reset();
-    store.SetSpectralDataList({{{"SPECTRAL_x", 0.5}, {"SPECTRAL_y", 0.6}}}, true);
-    ASSERT_EQ(engine_double::Calls().size(), 3u);
-    EXPECT_EQ(engine_double::Calls()[0].startNm, 0);
-    // No lead-in at all: nothing is computed.
-    engine_double::Reset();
-    store.SetSpectralDataList({{{"R380", 0.5}}}, true);
-    EXPECT_TRUE(engine_double::Calls().empty());
-    EXPECT_TRUE(store.xyzList.empty());
-    // An empty first spectrum: nothing is computed either.
-    store.SetSpectralDataList({{}, Spectrum("SPECTRAL_", 380, 730, 10)}, true);
-    EXPECT_TRUE(engine_double::Calls().empty());
-    EXPECT_EQ(store.spectralList.size(), 2u);
 }
 
 TEST_F(ListColorimetry, AFailingSpectrumLeavesNoEntry) {
@@ -112,17 +106,13 @@ TEST_F(ListColorimetry, AFailingSpectrumLeavesNoEntry) {
     engine_double::FailCall(4); // the second spectrum's XYZ call
     store.SetSpectralDataList(spectra, true);
     EXPECT_EQ(engine_double::Calls().size(), 7u); // 3 + 1 + 3
-    EXPECT_EQ(store.xyzList.size(), 2u);
-    EXPECT_EQ(store.labList.size(), 2u);
-    EXPECT_EQ(store.densityList.size(), 2u);
+    EXPECT_EQ(ComputedSizes(), (std::vector<std::size_t>{2, 2, 2}));
 
     for (Call failing : {Call::XYZToLab, Call::SpectralToDensity}) {
         engine_double::Reset();
         engine_double::FailAll(failing);
         store.SetSpectralDataList(spectra, true);
-        EXPECT_TRUE(store.xyzList.empty());
-        EXPECT_TRUE(store.labList.empty());
-        EXPECT_TRUE(store.densityList.empty());
+        EXPECT_EQ(ComputedSizes(), (std::vector<std::size_t>{0, 0, 0}));
     }
 }
 

@@ -1,6 +1,6 @@
-// A chart store without a file format, for testing the store on its own: the
-// file operations do nothing, and tests put patches, keywords and layout
-// numbers straight into the store.
+// A chart store without a file format, for what a read chart cannot reach: the
+// file operations do nothing, and tests put patches, keywords and masks
+// straight into the store.
 #pragma once
 
 #include <cstdint>
@@ -28,7 +28,6 @@ public:
     int WriteTargetFile(std::wstring, std::wstring) override { return 0; }
 
     using CSwatchlogBase::AnalyseSpectralKeys;
-    using CSwatchlogBase::ReadLayoutKeywords;
     using CSwatchlogBase::ResetChart;
     using CSwatchlogBase::SetKeyword;
     using CSwatchlogBase::UpdatePresenceFlags;
@@ -36,29 +35,14 @@ public:
     using CSwatchlogBase::borderPatches;
     using CSwatchlogBase::channelCount;
     using CSwatchlogBase::cmykList;
-    using CSwatchlogBase::cmykogList;
-    using CSwatchlogBase::cmykogvList;
-    using CSwatchlogBase::cmykrgbList;
     using CSwatchlogBase::densityList;
     using CSwatchlogBase::device;
     using CSwatchlogBase::filePath;
-    using CSwatchlogBase::hasCMYK;
     using CSwatchlogBase::hasCMYKO;
-    using CSwatchlogBase::hasCMYKOG;
-    using CSwatchlogBase::hasCMYKOGV;
-    using CSwatchlogBase::hasCMYKRGB;
-    using CSwatchlogBase::hasDensity;
-    using CSwatchlogBase::hasHTMLCOLOR;
-    using CSwatchlogBase::hasLAB;
-    using CSwatchlogBase::hasNColor;
-    using CSwatchlogBase::hasRGB;
-    using CSwatchlogBase::hasSpectral;
-    using CSwatchlogBase::hasXYZ;
     using CSwatchlogBase::keywordList;
     using CSwatchlogBase::keywordMap;
     using CSwatchlogBase::labList;
     using CSwatchlogBase::missingColorSpaces;
-    using CSwatchlogBase::nColorList;
     using CSwatchlogBase::normLight;
     using CSwatchlogBase::numberOfCols;
     using CSwatchlogBase::numberOfFields;
@@ -69,7 +53,6 @@ public:
     using CSwatchlogBase::patches;
     using CSwatchlogBase::patchesPerPage;
     using CSwatchlogBase::referenceSampleMap;
-    using CSwatchlogBase::rgbList;
     using CSwatchlogBase::sampleNameList;
     using CSwatchlogBase::spectralList;
     using CSwatchlogBase::uvCutMode;
@@ -84,54 +67,15 @@ constexpr std::uint32_t kNothingSupplied =
     MISSING_CMYK | MISSING_XYZ | MISSING_LAB | MISSING_RGB | MISSING_SPECTRAL | MISSING_CMYKOG |
     MISSING_CMYKRGB | MISSING_HTMLCOLOR | MISSING_NCOLOR | MISSING_CMYKOGV | MISSING_DENSITY;
 
-/// What a data row supplies; `supplied` holds the missing-space bits of the
-/// colour spaces given (everything else counts as missing).
-struct PatchValues {
-    tagCMYK cmyk;
-    tagXYZ xyz;
-    tagLAB lab;
-    tagRGB rgb;
-    tagCMYKOG cmykog;
-    tagCMYKRGB cmykrgb;
-    tagCMYKOGV cmykogv;
-    std::map<std::string, double> spectral;
-    std::map<int, tagNCLR> nColors;
-    tagHTMLCOLOR html;
-    tagDENSITY density;
-    std::string label;
-    std::uint32_t supplied = 0;
-};
-
-/// A patch made as the chart reader makes one: full constructor, then the
-/// row's missing-space mask.
-inline CColorPatch Build(const PatchValues& v) {
-    CColorPatch patch(v.cmyk, v.xyz, v.lab, v.rgb, v.cmykog, v.cmykrgb, v.cmykogv, v.spectral,
-                      v.nColors, v.html, v.density, v.label);
-    patch.SetMissingColorSpace(kNothingSupplied & ~v.supplied);
+/// A patch made as the chart reader makes one: full constructor, then the mask
+/// of the spaces not `supplied`.
+inline CColorPatch Build(const tagCMYK& cmyk, const tagCMYKOG& cmykog, const tagCMYKRGB& cmykrgb,
+                         const std::map<int, tagNCLR>& nColors, const std::string& label,
+                         std::uint32_t supplied) {
+    CColorPatch patch(cmyk, tagXYZ{}, tagLAB{}, tagRGB{}, cmykog, cmykrgb, tagCMYKOGV{}, {},
+                      nColors, tagHTMLCOLOR{}, tagDENSITY{}, label);
+    patch.SetMissingColorSpace(kNothingSupplied & ~supplied);
     return patch;
-}
-
-/// A patch that supplies CMYK and XYZ only (Lab and RGB are derived without the
-/// colour engine).
-inline CColorPatch Cmyk(double c, double m, double y, double k, tagXYZ xyz = {}) {
-    PatchValues v;
-    v.cmyk = {c, m, y, k};
-    v.xyz = xyz;
-    v.supplied = MISSING_CMYK | MISSING_XYZ;
-    return Build(v);
-}
-
-/// A patch that supplies n-colour channels 0 to values.size() - 1 only.
-inline CColorPatch NColor(const std::vector<double>& values) {
-    PatchValues v;
-    for (std::size_t i = 0; i < values.size(); ++i) {
-        tagNCLR channel;
-        channel.channel = static_cast<int>(i);
-        channel.value = values[i];
-        v.nColors[static_cast<int>(i)] = channel;
-    }
-    v.supplied = MISSING_NCOLOR;
-    return Build(v);
 }
 
 /// Spectral field names "<leadIn><wavelength>" from `first` to `last` in steps

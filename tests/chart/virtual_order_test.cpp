@@ -1,11 +1,12 @@
 // Hosts call the reader-writer's operations by their vtable position, so every
 // operation must sit in its fixed slot. Under the Itanium C++ ABI a pointer to
 // a virtual member function holds 1 + the byte offset of its vtable entry; the
-// virtual destructor takes slots 0 and 1.
+// virtual destructor takes slots 0 and 1, so the operations start at slot 2.
 #include <gtest/gtest.h>
 
 #include <cstdint>
 #include <cstring>
+#include <iterator>
 
 #include "redavudeva/swatchlog_base.h"
 
@@ -28,116 +29,60 @@ template <typename MemberPointer> long VtableSlot(MemberPointer member) {
 using B = CSwatchlogBase;
 using StringPairs = std::vector<std::pair<std::string, std::string>>;
 
-#define EXPECT_SLOT(member, slot) EXPECT_EQ(VtableSlot(member), slot) << #member
+struct Slot {
+    long slot;
+    const char* name;
+};
+// clang-format off
+#define SLOT(member) Slot{VtableSlot(member), #member}
+// clang-format on
 
-TEST(VirtualOrder, FileOperationsFollowTheDestructor) {
-    EXPECT_SLOT(&B::ReadChartFile, 2);
-    EXPECT_SLOT(&B::AppendColumnsWithWhitePoint, 3);
-    EXPECT_SLOT(&B::WriteChartFile, 4);
-    EXPECT_SLOT(&B::WriteMeasurementFile, 5);
-    EXPECT_SLOT(&B::AppendMissingColumns, 6);
-    EXPECT_SLOT(&B::InsertKeywords, 7);
-    EXPECT_SLOT(&B::CanReadFile, 8);
-    EXPECT_SLOT(&B::WriteTargetFile, 9);
-}
-
-TEST(VirtualOrder, CountsKeywordsAndPatches) {
-    EXPECT_SLOT(&B::GetPatchCount, 10);
-    EXPECT_SLOT(&B::GetNumberOfCols, 11);
-    EXPECT_SLOT(&B::GetNumberOfStrips, 12);
-    EXPECT_SLOT(&B::GetNumberOfPages, 13);
-    EXPECT_SLOT(&B::GetDevice, 14);
-    EXPECT_SLOT(&B::GetPatchesPerPage, 15);
-    EXPECT_SLOT(&B::GetKeywords, 16);
-    EXPECT_SLOT(&B::GetKeywordValue, 17);
-    EXPECT_SLOT(&B::GetPatch, 18);
-}
-
-TEST(VirtualOrder, ClosestPatchOverloadsInDeclaredOrder) {
-    EXPECT_SLOT(static_cast<int (B::*)(const tagCMYK&, double)>(&B::FindClosestPatch), 19);
-    EXPECT_SLOT(static_cast<int (B::*)(const tagCMYK&)>(&B::FindClosestPatch), 20);
-    EXPECT_SLOT(static_cast<int (B::*)(const tagCMYKOG&, double)>(&B::FindClosestPatch), 21);
-    EXPECT_SLOT(static_cast<int (B::*)(const tagCMYKOG&)>(&B::FindClosestPatch), 22);
-    EXPECT_SLOT(static_cast<int (B::*)(const tagCMYKRGB&, double)>(&B::FindClosestPatch), 23);
-    EXPECT_SLOT(static_cast<int (B::*)(const tagCMYKRGB&)>(&B::FindClosestPatch), 24);
-}
-
-TEST(VirtualOrder, RecordGettersAndCollections) {
-    EXPECT_SLOT(&B::GetPatchCMYK, 25);
-    EXPECT_SLOT(&B::GetPatchCMYKOG, 26);
-    EXPECT_SLOT(&B::GetPatchCMYKRGB, 27);
-    EXPECT_SLOT(&B::GetPatchXYZ, 28);
-    EXPECT_SLOT(&B::GetPatchLAB, 29);
-    EXPECT_SLOT(&B::GetPatchRGB, 30);
-    EXPECT_SLOT(&B::GetPatchDensity, 31);
-    EXPECT_SLOT(&B::CollectCMYK, 32);
-    EXPECT_SLOT(&B::CollectCMYKOG, 33);
-    EXPECT_SLOT(&B::CollectCMYKO, 34);
-    EXPECT_SLOT(&B::CollectCMYKOGV, 35);
-    EXPECT_SLOT(&B::CollectCMYKRGB, 36);
-    EXPECT_SLOT(&B::CollectXYZ, 37);
-    EXPECT_SLOT(&B::CollectLAB, 38);
-    EXPECT_SLOT(&B::CollectRGB, 39);
-    EXPECT_SLOT(&B::CollectHTMLCOLOR, 40);
-    EXPECT_SLOT(&B::CollectNColorMaps, 41);
-    EXPECT_SLOT(&B::GetDeviceValueLists, 42);
-    EXPECT_SLOT(&B::CollectDensities, 43);
-}
-
-TEST(VirtualOrder, LayoutAndStrips) {
-    EXPECT_SLOT(&B::SetLayout, 44);
-    EXPECT_SLOT(&B::SetNumberOfPages, 45);
-    EXPECT_SLOT(&B::CollectStripRGB, 46);
-    EXPECT_SLOT(&B::CollectStripLAB, 47);
-    EXPECT_SLOT(&B::CollectStripXYZ, 48);
-    EXPECT_SLOT(&B::CollectStripCMYKOGV, 49);
-    EXPECT_SLOT(&B::CollectStripCMYKRGB, 50);
-    EXPECT_SLOT(&B::CollectStripCMYKO, 51);
-    EXPECT_SLOT(&B::CollectStripCMYKOG, 52);
-    EXPECT_SLOT(&B::CollectStripCMYK, 53);
-}
-
-TEST(VirtualOrder, ListsSpectraAndDeviceQueries) {
-    EXPECT_SLOT(&B::GetPatchList, 54);
-    EXPECT_SLOT(&B::GetSpectralDataList, 55);
-    EXPECT_SLOT(&B::GetSpectralRange, 56);
-    EXPECT_SLOT(&B::IsColorSpacePresent, 57);
-    EXPECT_SLOT(&B::GetDeviceColorSpace, 58);
-    EXPECT_SLOT(&B::GetDeviceChannelCount, 59);
-    EXPECT_SLOT(&B::GetChartType, 60);
-    EXPECT_SLOT(&B::SetChartType, 61);
-    EXPECT_SLOT(&B::WriteDeviceControlSequence, 62);
-}
-
-TEST(VirtualOrder, SelectionsAndRamps) {
-    EXPECT_SLOT(&B::SelectCMYKRGBGradient, 63);
-    EXPECT_SLOT(&B::SelectCMYKOGGradient, 64);
-    EXPECT_SLOT(&B::SelectCMYKGradient, 65);
-    EXPECT_SLOT(&B::SelectCleanAndWhitePatches, 66);
-    EXPECT_SLOT(&B::SelectCleanColorPatches, 67);
-    EXPECT_SLOT(&B::GroupCleanColorPatches, 68);
-    EXPECT_SLOT(&B::GetChannelRamps, 69);
-}
-
-TEST(VirtualOrder, SettersAndTheLastOperations) {
-    EXPECT_SLOT(&B::SetChartNormLight, 70);
-    EXPECT_SLOT(static_cast<void (B::*)(const StringPairs&)>(&B::SetKeywordList), 71);
-    EXPECT_SLOT(&B::SetSampleNameList, 72);
-    EXPECT_SLOT(&B::SetCMYKList, 73);
-    EXPECT_SLOT(&B::SetCMYKOGList, 74);
-    EXPECT_SLOT(&B::SetCMYKRGBList, 75);
-    EXPECT_SLOT(&B::SetCMYKOGVList, 76);
-    EXPECT_SLOT(&B::SetXYZList, 77);
-    EXPECT_SLOT(&B::SetLABList, 78);
-    EXPECT_SLOT(&B::SetRGBList, 79);
-    EXPECT_SLOT(&B::SetSpectralDataList, 80);
-    EXPECT_SLOT(&B::SetNColorList, 81);
-    EXPECT_SLOT(&B::AddKeyword, 82);
-    EXPECT_SLOT(&B::GetDataFormatLine, 83);
-    EXPECT_SLOT(&B::SetDataFormatLine, 84);
-    EXPECT_SLOT(&B::ClearLists, 85);
-    EXPECT_SLOT(&B::GetReferenceSampleMap, 86);
-    EXPECT_SLOT(&B::GetProcessColorNames, 87);
+TEST(VirtualOrder, EveryOperationSitsInItsDeclaredSlot) {
+    // In declared order: entry i must be slot i + 2.
+    // clang-format off
+    const Slot slots[] = {
+        SLOT(&B::ReadChartFile), SLOT(&B::AppendColumnsWithWhitePoint), SLOT(&B::WriteChartFile),
+        SLOT(&B::WriteMeasurementFile), SLOT(&B::AppendMissingColumns), SLOT(&B::InsertKeywords),
+        SLOT(&B::CanReadFile), SLOT(&B::WriteTargetFile), SLOT(&B::GetPatchCount),
+        SLOT(&B::GetNumberOfCols), SLOT(&B::GetNumberOfStrips), SLOT(&B::GetNumberOfPages),
+        SLOT(&B::GetDevice), SLOT(&B::GetPatchesPerPage), SLOT(&B::GetKeywords),
+        SLOT(&B::GetKeywordValue), SLOT(&B::GetPatch),
+        SLOT(static_cast<int (B::*)(const tagCMYK&, double)>(&B::FindClosestPatch)),
+        SLOT(static_cast<int (B::*)(const tagCMYK&)>(&B::FindClosestPatch)),
+        SLOT(static_cast<int (B::*)(const tagCMYKOG&, double)>(&B::FindClosestPatch)),
+        SLOT(static_cast<int (B::*)(const tagCMYKOG&)>(&B::FindClosestPatch)),
+        SLOT(static_cast<int (B::*)(const tagCMYKRGB&, double)>(&B::FindClosestPatch)),
+        SLOT(static_cast<int (B::*)(const tagCMYKRGB&)>(&B::FindClosestPatch)),
+        SLOT(&B::GetPatchCMYK), SLOT(&B::GetPatchCMYKOG), SLOT(&B::GetPatchCMYKRGB),
+        SLOT(&B::GetPatchXYZ), SLOT(&B::GetPatchLAB), SLOT(&B::GetPatchRGB),
+        SLOT(&B::GetPatchDensity), SLOT(&B::CollectCMYK), SLOT(&B::CollectCMYKOG),
+        SLOT(&B::CollectCMYKO), SLOT(&B::CollectCMYKOGV), SLOT(&B::CollectCMYKRGB),
+        SLOT(&B::CollectXYZ), SLOT(&B::CollectLAB), SLOT(&B::CollectRGB),
+        SLOT(&B::CollectHTMLCOLOR), SLOT(&B::CollectNColorMaps), SLOT(&B::GetDeviceValueLists),
+        SLOT(&B::CollectDensities), SLOT(&B::SetLayout), SLOT(&B::SetNumberOfPages),
+        SLOT(&B::CollectStripRGB), SLOT(&B::CollectStripLAB), SLOT(&B::CollectStripXYZ),
+        SLOT(&B::CollectStripCMYKOGV), SLOT(&B::CollectStripCMYKRGB), SLOT(&B::CollectStripCMYKO),
+        SLOT(&B::CollectStripCMYKOG), SLOT(&B::CollectStripCMYK), SLOT(&B::GetPatchList),
+        SLOT(&B::GetSpectralDataList), SLOT(&B::GetSpectralRange), SLOT(&B::IsColorSpacePresent),
+        SLOT(&B::GetDeviceColorSpace), SLOT(&B::GetDeviceChannelCount), SLOT(&B::GetChartType),
+        SLOT(&B::SetChartType), SLOT(&B::WriteDeviceControlSequence),
+        SLOT(&B::SelectCMYKRGBGradient), SLOT(&B::SelectCMYKOGGradient),
+        SLOT(&B::SelectCMYKGradient), SLOT(&B::SelectCleanAndWhitePatches),
+        SLOT(&B::SelectCleanColorPatches), SLOT(&B::GroupCleanColorPatches),
+        SLOT(&B::GetChannelRamps), SLOT(&B::SetChartNormLight),
+        SLOT(static_cast<void (B::*)(const StringPairs&)>(&B::SetKeywordList)),
+        SLOT(&B::SetSampleNameList), SLOT(&B::SetCMYKList), SLOT(&B::SetCMYKOGList),
+        SLOT(&B::SetCMYKRGBList), SLOT(&B::SetCMYKOGVList), SLOT(&B::SetXYZList),
+        SLOT(&B::SetLABList), SLOT(&B::SetRGBList), SLOT(&B::SetSpectralDataList),
+        SLOT(&B::SetNColorList), SLOT(&B::AddKeyword), SLOT(&B::GetDataFormatLine),
+        SLOT(&B::SetDataFormatLine), SLOT(&B::ClearLists), SLOT(&B::GetReferenceSampleMap),
+        SLOT(&B::GetProcessColorNames),
+    };
+    // clang-format on
+    ASSERT_EQ(std::size(slots), 86u); // 87 operations less the destructor
+    for (std::size_t i = 0; i < std::size(slots); ++i) {
+        EXPECT_EQ(slots[i].slot, static_cast<long>(i) + 2) << slots[i].name;
+    }
 }
 
 } // namespace
