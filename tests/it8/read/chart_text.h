@@ -24,17 +24,14 @@ inline std::string Lines(std::initializer_list<std::string> lines,
 /// A chart of one data block; `sets` < 0 announces as many sets as there are rows.
 inline std::string Chart(const std::string& fields, std::initializer_list<std::string> rows,
                          int sets = -1) {
-    std::string text =
-        Lines({"NUMBER_OF_SETS " + std::to_string(sets < 0 ? static_cast<int>(rows.size()) : sets),
-               "BEGIN_DATA_FORMAT", fields, "END_DATA_FORMAT", "BEGIN_DATA"});
-    for (const std::string& row : rows) {
-        text += row + "\n";
-    }
-    return text + "END_DATA\n";
+    const int count = sets < 0 ? static_cast<int>(rows.size()) : sets;
+    return Lines({"NUMBER_OF_SETS " + std::to_string(count), "BEGIN_DATA_FORMAT", fields,
+                  "END_DATA_FORMAT", "BEGIN_DATA"}) +
+           Lines(rows) + "END_DATA\n";
 }
 
-/// Two CMYK and Lab patches behind an identification line, a quoted keyword and a
-/// skipped section; SAMPLE_IDs 101 and 102, NUMBER_OF_SETS after the format.
+/// Two CMYK and Lab patches (SAMPLE_IDs 101, 102) behind an identification line, a
+/// quoted keyword and a skipped section; NUMBER_OF_SETS after the format.
 inline std::string CmykLabChart(const std::string& lineEnd = "\n") {
     return Lines({"CGATS.17", "ORIGINATOR\t\"Chart maker\"", "BEGIN_MEASUREMENT_SCRIPT",
                   "NUMBER_OF_SETS 99", "END_MEASUREMENT_SCRIPT", "NUMBER_OF_FIELDS 9",

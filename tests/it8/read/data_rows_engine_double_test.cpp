@@ -10,34 +10,38 @@
 using namespace reader_test;
 using test_support::TempDir;
 
-TEST(DataRowsEngine, LabRowsAreConvertedToXyzOncePerPatch) {
+TEST(DataRowsEngine, LabAndSpectralRowsAndAFailingEngine) {
     TempDir dir;
     CIT8ReaderWriter reader;
     engine_double::Reset();
     ASSERT_EQ(ReadText(reader, dir,
                        Chart("SAMPLE_ID LAB_L LAB_A LAB_B", {"1 95,5 -1.25 2.5", "2 50 20 -30"})),
               0);
-    const auto& calls = engine_double::Calls();
-    ASSERT_EQ(calls.size(), 2u);
+    auto calls = engine_double::Calls();
+    ASSERT_EQ(calls.size(), 2u); // once per patch
     EXPECT_EQ(calls[0].call, engine_double::Call::LabToXYZ);
     EXPECT_EQ(calls[0].input, (std::vector<float>{95.5f, -1.25f, 2.5f}));
     EXPECT_EQ(calls[1].input, (std::vector<float>{50.0f, 20.0f, -30.0f}));
     EXPECT_TRUE(reader.IsColorSpacePresent(COLORSPACE_XYZ));
-}
 
-TEST(DataRowsEngine, SpectralRowsAndAFailingEngine) {
-    TempDir dir;
+    // 36 spectral fields with the "nm" lead-in in lower case (upper-cased on reading).
     std::string fields = "SAMPLE_ID";
     std::string row;
     for (int nm = 380; nm <= 730; nm += 10) {
-        fields += " SPECTRAL_NM_" + std::to_string(nm);
-        row += " 0,5";
+        fields += " nm" + std::to_string(nm);
+        row += " 0," + std::to_string(nm / 10); // 0,38 ... 0,73
     }
     const std::string chart = Chart(fields, {"1" + row, "2" + row, "3" + row});
-
-    CIT8ReaderWriter reader;
     engine_double::Reset();
     ASSERT_EQ(ReadText(reader, dir, chart), 0);
+    const auto spectrum = PatchOf(reader, 1).GetSpectralData();
+    ASSERT_EQ(spectrum.size(), 36u);
+    EXPECT_EQ(spectrum.at("NM380"), 0.38);
+    EXPECT_EQ(spectrum.at("NM730"), 0.73);
+    const SpectralRangeStruct range = reader.GetSpectralRange();
+    EXPECT_EQ(range.startNm, 380);
+    EXPECT_EQ(range.stepNm, 10);
+    EXPECT_EQ(range.count, 36);
     int spectralToXyz = 0;
     for (const auto& call : engine_double::Calls()) {
         if (call.call == engine_double::Call::SpectralToXYZ) {

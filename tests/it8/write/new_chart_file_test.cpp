@@ -1,9 +1,10 @@
-// The new-file writer: field order, number formats, set counts, refusals and
-// a read back through the reader.
+// The new-file writer: field order, number formats, set counts and a read back
+// through the reader; writers under a decimal-comma locale.
 #include <gtest/gtest.h>
 
 #include <clocale>
 #include <filesystem>
+#include <locale>
 #include <map>
 #include <string>
 #include <vector>
@@ -16,15 +17,7 @@ using test_support::Wide;
 using test_support::WriteBytes;
 using write_test::FileText;
 using write_test::Source;
-
-namespace {
-
-int WriteNew(CIT8ReaderWriter& chart, const std::filesystem::path& target) {
-    // The template path is not used by the new-file mode.
-    return chart.WriteChartFile(L"no such template", Wide(target), false);
-}
-
-} // namespace
+using write_test::WriteNew;
 
 TEST(NewChartFile, WritesTheTwoSetExampleByteForByte) {
     TempDir dir;
@@ -42,15 +35,18 @@ TEST(NewChartFile, WritesTheTwoSetExampleByteForByte) {
                   "END_DATA_FORMAT", "NUMBER_OF_SETS\t2", "BEGIN_DATA",
                   "1\tA\t100.00\t0.00\t0.00\t0.00\t55.00\t-37.00\t-50.00",
                   "2\tB\t0.00\t100.00\t0.00\t0.00\t48.00\t74.00\t-3.00", "END_DATA"}));
-}
 
-TEST(NewChartFile, EmptyStoreWritesSevenLines) {
-    TempDir dir;
-    CIT8ReaderWriter chart;
-    ASSERT_EQ(WriteNew(chart, dir.file("out.txt")), 0);
-    EXPECT_EQ(ReadBytes(dir.file("out.txt")),
-              FileText({"IT8", "NUMBER_OF_FIELDS\t0", "BEGIN_DATA_FORMAT", "END_DATA_FORMAT",
-                        "NUMBER_OF_SETS\t0", "BEGIN_DATA", "END_DATA"}));
+    // The file reads back with the same values.
+    CIT8ReaderWriter reader;
+    ASSERT_EQ(reader.ReadChartFile(Wide(dir.file("out.txt"))), 0);
+    std::vector<std::vector<double>> cmyk;
+    ASSERT_EQ(reader.GetDeviceValueLists(cmyk), 0);
+    EXPECT_EQ(cmyk, (std::vector<std::vector<double>>{{100, 0, 0, 0}, {0, 100, 0, 0}}));
+    tagLAB lab;
+    ASSERT_EQ(reader.GetPatchLAB(2, lab), 0);
+    EXPECT_EQ(std::vector<double>({lab.l, lab.a, lab.b}), std::vector<double>({48, 74, -3}));
+    int result = -1;
+    EXPECT_EQ(reader.GetPatch(2, result).GetLabel(), "B");
 }
 
 TEST(NewChartFile, KeywordsAndMeasurementBlocksInTheirFixedOrder) {
@@ -84,16 +80,6 @@ TEST(NewChartFile, KeywordsAndMeasurementBlocksInTheirFixedOrder) {
 
 TEST(NewChartFile, DeviceListsDecideTheSetCount) {
     TempDir dir;
-    CIT8ReaderWriter cmykOnly;
-    cmykOnly.SetCMYKList({tagCMYK{1, 2, 3, 4}});
-    ASSERT_EQ(WriteNew(cmykOnly, dir.file("cmyk.txt")), 0);
-    // CMYK as the last block leaves a trailing tab on the format line.
-    EXPECT_EQ(
-        ReadBytes(dir.file("cmyk.txt")),
-        FileText({"IT8", "NUMBER_OF_FIELDS\t5", "BEGIN_DATA_FORMAT",
-                  "SAMPLE_ID\tCMYK_C\tCMYK_M\tCMYK_Y\tCMYK_K\t", "END_DATA_FORMAT",
-                  "NUMBER_OF_SETS\t1", "BEGIN_DATA", "1\t1.00\t2.00\t3.00\t4.00", "END_DATA"}));
-
     CIT8ReaderWriter sixColour;
     sixColour.SetCMYKList({tagCMYK{1, 0, 0, 0}, tagCMYK{2, 0, 0, 0}, tagCMYK{3, 0, 0, 0}});
     tagCMYKOG six;
@@ -111,148 +97,76 @@ TEST(NewChartFile, DeviceListsDecideTheSetCount) {
                   "2\t2.00\t0.00\t0.00\t0.00\t0.00\t0.00\t0.00\t0.00\t40.00\t0.00", "END_DATA"}));
 }
 
-TEST(NewChartFile, ListsThatCannotFillEverySetAnswer24AndWriteNothing) {
+TEST(NewChartFile, EmptyStoreWritesSevenLinesAlsoUnderALongName) {
     TempDir dir;
-    const auto target = dir.write("out.txt", "old content");
-
-    CIT8ReaderWriter shortLab;
-    shortLab.SetCMYKList({tagCMYK{1, 0, 0, 0}, tagCMYK{2, 0, 0, 0}});
-    shortLab.SetLABList({tagLAB{50, 0, 0}});
-    EXPECT_EQ(WriteNew(shortLab, target), 24);
-
-    CIT8ReaderWriter otherWavelengths;
-    otherWavelengths.SetSpectralDataList({{{"SPECTRAL_NM_380", 0.1}, {"SPECTRAL_NM_390", 0.2}},
-                                          {{"SPECTRAL_NM_390", 0.2}, {"SPECTRAL_NM_400", 0.3}}},
-                                         false);
-    EXPECT_EQ(WriteNew(otherWavelengths, target), 24);
-
-    EXPECT_EQ(ReadBytes(target), "old content");
-    EXPECT_EQ(std::distance(std::filesystem::directory_iterator(dir.path()), {}), 1);
-}
-
-TEST(NewChartFile, TargetThatCannotBeWrittenAnswers23) {
-    TempDir dir;
-    CIT8ReaderWriter chart;
-    chart.SetCMYKList({tagCMYK{1, 0, 0, 0}});
-    EXPECT_EQ(WriteNew(chart, dir.file("missing folder") / "out.txt"), 23);
-    EXPECT_FALSE(std::filesystem::exists(dir.file("missing folder")));
-
-    std::filesystem::create_directory(dir.file("folder"));
-    EXPECT_EQ(WriteNew(chart, dir.file("folder")), 23);
-    EXPECT_TRUE(std::filesystem::is_directory(dir.file("folder")));
-    // No temporary file is left behind.
-    EXPECT_EQ(std::distance(std::filesystem::directory_iterator(dir.path()), {}), 1);
-
-    // A read-only target stays as it is; a writable one keeps its permissions.
-    namespace fs = std::filesystem;
-    const auto readOnly = dir.write("read-only.txt", "keep");
-    fs::permissions(readOnly, fs::perms::owner_read);
-    EXPECT_EQ(WriteNew(chart, readOnly), 23);
-    EXPECT_EQ(ReadBytes(readOnly), "keep");
-    fs::permissions(readOnly, fs::perms::owner_all); // so that the folder can be removed
-#if !defined(_WIN32)                                 // Windows keeps only a read-only attribute
-    const auto shared = dir.write("shared.txt", "old");
-    fs::permissions(shared, fs::perms::owner_read | fs::perms::owner_write | fs::perms::group_read);
-    EXPECT_EQ(WriteNew(chart, shared), 0);
-    EXPECT_EQ(fs::status(shared).permissions(),
-              fs::perms::owner_read | fs::perms::owner_write | fs::perms::group_read);
-#endif
-
-#if defined(__linux__)
-    // A device that accepts the open but fails every write.
-    if (std::filesystem::exists("/dev/full")) {
-        EXPECT_EQ(WriteNew(chart, "/dev/full"), 23);
-    }
-#endif
-}
-
-TEST(NewChartFile, TargetNameNearTheFileSystemLimitIsWritten) {
-    // 244 characters: a valid file name (at most 255 on the usual file systems),
-    // which a writer must create or replace like any other.
-#if defined(_WIN32)
-    GTEST_SKIP() << "the folder and the name together pass the classic Windows path limit";
-#endif
-    TempDir dir;
-    const std::string longName = std::string(240, 'n') + ".txt";
     const std::string sevenLines =
         FileText({"IT8", "NUMBER_OF_FIELDS\t0", "BEGIN_DATA_FORMAT", "END_DATA_FORMAT",
                   "NUMBER_OF_SETS\t0", "BEGIN_DATA", "END_DATA"});
     CIT8ReaderWriter chart;
-    ASSERT_EQ(WriteNew(chart, dir.file(longName)), 0);
-    EXPECT_EQ(ReadBytes(dir.file(longName)), sevenLines);
-    WriteBytes(dir.file(longName), "old");
-    ASSERT_EQ(WriteNew(chart, dir.file(longName)), 0);
-    EXPECT_EQ(ReadBytes(dir.file(longName)), sevenLines);
-
-    // The other writers share the way out: InsertKeywords on a one-line source.
+    ASSERT_EQ(WriteNew(chart, dir.file("out.txt")), 0);
+    EXPECT_EQ(ReadBytes(dir.file("out.txt")), sevenLines);
+#if !defined(_WIN32) // the folder and the name together pass the classic Windows path limit
+    // 244 characters is a valid name (at most 255 on the usual file systems), which
+    // the writers must create or replace like any other.
+    const auto longName = dir.file(std::string(240, 'n') + ".txt");
+    WriteBytes(longName, "old");
+    ASSERT_EQ(WriteNew(chart, longName), 0);
+    EXPECT_EQ(ReadBytes(longName), sevenLines);
     const auto source = dir.write("source.txt", "CGATS.17\n");
-    ASSERT_EQ(chart.InsertKeywords(Wide(source), Wide(dir.file(longName)), {{"K", "v"}}), 0);
-    EXPECT_EQ(ReadBytes(dir.file(longName)), FileText({"CGATS.17", "K\tv"}));
-    // Nothing but the source and the target remains in the folder.
-    EXPECT_EQ(std::distance(std::filesystem::directory_iterator(dir.path()), {}), 2);
+    ASSERT_EQ(chart.InsertKeywords(Wide(source), Wide(longName), {{"K", "v"}}), 0);
+    EXPECT_EQ(ReadBytes(longName), FileText({"CGATS.17", "K\tv"}));
+    EXPECT_EQ(write_test::EntryCount(dir.path()), 3); // no temporary file is left behind
+#endif
 }
 
-TEST(NewChartFile, WrittenChartReadsBackWithTheSameValues) {
-    TempDir dir;
-    std::map<std::string, double> first;
-    std::map<std::string, double> second;
-    for (int nm = 380; nm <= 730; nm += 10) {
-        first["SPECTRAL_NM_" + std::to_string(nm)] = (nm - 300) / 1000.0; // 0.08 .. 0.43
-        second["SPECTRAL_NM_" + std::to_string(nm)] = 0.90125;
-    }
-    CIT8ReaderWriter chart;
-    chart.SetSampleNameList({"paper", "cyan"});
-    chart.SetCMYKList({tagCMYK{0, 0, 0, 0}, tagCMYK{100, 12.5, 0, 3.25}});
-    chart.SetLABList({tagLAB{95.5, -0.25, 2.75}, tagLAB{55, -37, -50}});
-    chart.SetSpectralDataList({first, second}, false);
-    ASSERT_EQ(WriteNew(chart, dir.file("chart.txt")), 0);
+namespace {
 
-    CIT8ReaderWriter reader;
-    ASSERT_EQ(reader.ReadChartFile(Wide(dir.file("chart.txt"))), 0);
-    ASSERT_EQ(reader.GetPatchCount(), 2);
-    tagCMYK cmyk;
-    ASSERT_EQ(reader.GetPatchCMYK(2, cmyk), 0);
-    EXPECT_DOUBLE_EQ(cmyk.c, 100);
-    EXPECT_DOUBLE_EQ(cmyk.m, 12.5);
-    EXPECT_DOUBLE_EQ(cmyk.y, 0);
-    EXPECT_DOUBLE_EQ(cmyk.k, 3.25);
-    tagLAB lab;
-    ASSERT_EQ(reader.GetPatchLAB(1, lab), 0);
-    EXPECT_DOUBLE_EQ(lab.l, 95.5);
-    EXPECT_DOUBLE_EQ(lab.a, -0.25);
-    EXPECT_DOUBLE_EQ(lab.b, 2.75);
-    const std::vector<std::map<std::string, double>> spectra = reader.GetSpectralDataList();
-    ASSERT_EQ(spectra.size(), 2u);
-    ASSERT_EQ(spectra[0].size(), 36u);
-    for (const auto& field : first) {
-        EXPECT_NEAR(spectra[0].at(field.first), field.second, 1e-12) << field.first;
-        EXPECT_NEAR(spectra[1].at(field.first), 0.90125, 1e-12) << field.first;
-    }
-}
+struct CommaDecimal : std::numpunct<char> {
+    char do_decimal_point() const override { return ','; }
+};
 
-TEST(NewChartFile, DecimalCommaLocaleStillWritesPoints) {
-    const char* names[] = {"de_DE.UTF-8",        "de_DE.utf8", "de_DE",
-                           "fr_FR.UTF-8",        "fr_FR.utf8", "nl_NL.UTF-8",
-                           "German_Germany.1252"};
-    const std::string previous = std::setlocale(LC_ALL, nullptr);
-    const char* found = nullptr;
-    for (const char* name : names) {
+} // namespace
+
+TEST(Writers, DecimalCommaLocalesStillWritePoints) {
+    // The C library's locale where one with a decimal comma is installed, and
+    // always a global stream locale with a decimal comma.
+    const std::string previousC = std::setlocale(LC_ALL, nullptr);
+    for (const char* name : {"de_DE.UTF-8", "de_DE.utf8", "fr_FR.UTF-8", "German_Germany.1252"}) {
         if (std::setlocale(LC_ALL, name) != nullptr) {
-            found = name;
             break;
         }
     }
-    if (found == nullptr) {
-        GTEST_SKIP() << "no locale with a decimal comma is installed";
-    }
+    const std::locale previous =
+        std::locale::global(std::locale(std::locale::classic(), new CommaDecimal));
     TempDir dir;
     CIT8ReaderWriter chart;
-    chart.SetLABList({tagLAB{55.5, -37.25, 0.126}});
-    const int result = WriteNew(chart, dir.file("out.txt"));
-    std::setlocale(LC_ALL, previous.c_str());
-    ASSERT_EQ(result, 0);
-    EXPECT_EQ(ReadBytes(dir.file("out.txt")),
-              FileText({"IT8", "NUMBER_OF_FIELDS\t4", "BEGIN_DATA_FORMAT",
-                        "SAMPLE_ID\tLAB_L\tLAB_A\tLAB_B", "END_DATA_FORMAT", "NUMBER_OF_SETS\t1",
-                        "BEGIN_DATA", "1\t55.50\t-37.25\t0.13", "END_DATA"}));
+    chart.SetCMYKList({tagCMYK{1.5, 2, 3, 4.125}});
+    const int newResult = WriteNew(chart, dir.file("new.txt"));
+    const auto source =
+        dir.write("template.txt", Source({"BEGIN_DATA_FORMAT", "SAMPLE_ID", "END_DATA_FORMAT",
+                                          "BEGIN_DATA", "1", "END_DATA"}));
+    chart.SetCMYKList({});
+    chart.SetXYZList({tagXYZ{41.25, 0.5, 8}});
+    const CColorPatch white(tagCMYK(), tagXYZ{96.42, 100, 82.51}, tagLAB(), tagRGB(), tagCMYKOG(),
+                            tagCMYKOGV(), tagCMYKRGB(), {}, tagHTMLCOLOR(), "white");
+    testing::internal::CaptureStdout();
+    const int whiteResult =
+        chart.AppendColumnsWithWhitePoint(Wide(source), Wide(dir.file("white.txt")), white, white);
+    testing::internal::GetCapturedStdout();
+    std::locale::global(previous);
+    std::setlocale(LC_ALL, previousC.c_str());
+
+    // CMYK as the last block leaves a trailing tab on the format line; 4.125 is
+    // exact in binary and "%.2f" rounds the tie to even: 4.12.
+    ASSERT_EQ(newResult, 0);
+    EXPECT_EQ(
+        ReadBytes(dir.file("new.txt")),
+        FileText({"IT8", "NUMBER_OF_FIELDS\t5", "BEGIN_DATA_FORMAT",
+                  "SAMPLE_ID\tCMYK_C\tCMYK_M\tCMYK_Y\tCMYK_K\t", "END_DATA_FORMAT",
+                  "NUMBER_OF_SETS\t1", "BEGIN_DATA", "1\t1.50\t2.00\t3.00\t4.12", "END_DATA"}));
+    ASSERT_EQ(whiteResult, 0);
+    const std::string text = ReadBytes(dir.file("white.txt"));
+    EXPECT_NE(text.find("WHITE_POINT_MEASURED_XYZ\t\"96.42\t100\t82.51\""), std::string::npos);
+    EXPECT_NE(text.find("1\t    41.25\t     0.50\t     8.00"), std::string::npos);
+    EXPECT_EQ(text.find(','), std::string::npos);
 }

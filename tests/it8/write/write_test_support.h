@@ -1,6 +1,7 @@
 // Helpers shared by the chart writer tests.
 #pragma once
 
+#include <filesystem>
 #include <initializer_list>
 #include <string>
 
@@ -9,35 +10,40 @@
 
 namespace write_test {
 
-/// The lines as a file written in text mode holds them.
-inline std::string FileText(std::initializer_list<std::string> lines) {
-#if defined(_WIN32)
-    const char* end = "\r\n";
-#else
-    const char* end = "\n";
-#endif
+/// The lines joined, each followed by `end`; a line end inside an entry becomes `end` too.
+inline std::string Joined(std::initializer_list<std::string> lines, const std::string& end) {
     std::string text;
     for (const std::string& line : lines) {
-        // A line end inside an entry is written as a line end too.
         for (const char c : line) {
-            if (c == '\n') {
-                text += end;
-            } else {
-                text += c;
-            }
+            text += c == '\n' ? end : std::string(1, c);
         }
         text += end;
     }
     return text;
 }
 
-/// The lines joined with LF, as a source file the tests hand to a writer.
+/// The lines as a file written in text mode holds them.
+inline std::string FileText(std::initializer_list<std::string> lines) {
+#if defined(_WIN32)
+    return Joined(lines, "\r\n");
+#else
+    return Joined(lines, "\n");
+#endif
+}
+
+/// The lines as a source file handed to a writer (LF line ends).
 inline std::string Source(std::initializer_list<std::string> lines) {
-    std::string text;
-    for (const std::string& line : lines) {
-        text += line + "\n";
-    }
-    return text;
+    return Joined(lines, "\n");
+}
+
+/// The new-file writer; it does not use the template path.
+inline int WriteNew(CIT8ReaderWriter& chart, const std::filesystem::path& target) {
+    return chart.WriteChartFile(L"no such template", test_support::Wide(target), false);
+}
+
+/// How many entries a folder holds.
+inline long EntryCount(const std::filesystem::path& folder) {
+    return static_cast<long>(std::distance(std::filesystem::directory_iterator(folder), {}));
 }
 
 } // namespace write_test
