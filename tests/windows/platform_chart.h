@@ -1,39 +1,34 @@
-// The chart and the line-end checks shared by the platform tests.
+// The chart and the helpers shared by the platform tests.
 #pragma once
 
 #include <memory>
 #include <string>
-#include <vector>
-
-#include <gtest/gtest.h>
 
 #include "redavudeva/redavudeva.h"
 
 namespace platform_test {
 
-/// Data rows of the chart: six clean or white patches, then mixed ones.
+/// Data rows of the chart: white, cyan, then mixed patches.
 constexpr int kChartSets = 30;
 
-/// The chart as lines without line ends: identification, quoted keywords, the
-/// layout keywords (3 columns, 10 strips), a device-control section holding
-/// "\tSET SPEED 2" and "MOVE  TO 10 20", and SAMPLE_ID, CMYK and Lab per row.
-std::vector<std::string> ChartLines();
+/// The chart, each line followed by `lineEnd`: a quoted ORIGINATOR, a COMMENT
+/// holding a Ctrl-Z byte ("stop\x1Ahere"), 3 columns by 10 strips, a
+/// device-control section of "\tSET SPEED 2" and "MOVE  TO 10 20", and
+/// SAMPLE_ID, CMYK and Lab per row. Over 1023 characters, so that it is also
+/// read CR-only.
+std::string ChartText(const std::string& lineEnd);
 
-/// The lines, each followed by `lineEnd`.
-std::string JoinLines(const std::vector<std::string>& lines, const std::string& lineEnd);
-
-/// The line end a text-mode file gets on disk here: "\r\n" on Windows, "\n" elsewhere.
-std::string NativeLineEnd();
-
-/// Success when `bytes` holds at least one line end, ends with one, and every
-/// line end is the native one (no lone CR or LF, no CR CR LF).
-::testing::AssertionResult HasOnlyNativeLineEnds(const std::string& bytes);
+/// The line end a text-mode file gets on disk here: CR LF on Windows, LF elsewhere.
+#if defined(_WIN32)
+inline const std::string kNativeLineEnd = "\r\n";
+#else
+inline const std::string kNativeLineEnd = "\n";
+#endif
 
 /// A reader-writer from the library's factory, deleted through its base class.
-struct ReaderWriterDeleter {
-    void operator()(CSwatchlogBase* readerWriter) const { delete readerWriter; }
-};
-using ReaderWriterPtr = std::unique_ptr<CSwatchlogBase, ReaderWriterDeleter>;
-ReaderWriterPtr NewReaderWriter();
+using ReaderWriterPtr = std::unique_ptr<CSwatchlogBase>;
+inline ReaderWriterPtr NewReaderWriter() {
+    return ReaderWriterPtr(CSwatchlogFactory::GetReaderWriter(CSwatchlogFactory::READERWRITER_IT8));
+}
 
 } // namespace platform_test
