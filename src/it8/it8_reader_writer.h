@@ -91,4 +91,8 @@ private:
     void AppendDataRows(std::vector<std::string>& lines, std::uint32_t setCount);
     /// The template's lines with the store's columns appended: 0, 21, 23, 24.
     int AppendColumnsToFile(const std::wstring& templatePath, const std::wstring& targetPath);
+    /// Reads a source chart into `source` and as plain lines: 0, 22 (not a readable
+    /// chart) or 21 (cannot be opened).
+    static int LoadSourceChart(const std::wstring& path, CIT8ReaderWriter& source,
+                               std::vector<std::string>& lines);
 };

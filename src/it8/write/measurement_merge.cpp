@@ -34,13 +34,9 @@ double ChannelValue(const std::map<int, tagNCLR>& channels, int channel) {
 
 int CIT8ReaderWriter::WriteMeasurementFile(std::wstring sourcePath, std::wstring targetPath) {
     CIT8ReaderWriter source;
-    if (source.ReadChartFile(sourcePath) != 0) {
-        return 22;
-    }
     std::vector<std::string> lines;
-    const int readResult = ReadFileLines(sourcePath, lines);
-    if (readResult != 0) {
-        return readResult;
+    if (const int loaded = LoadSourceChart(sourcePath, source, lines); loaded != 0) {
+        return loaded;
     }
     const it8::ChartSections sections = it8::LocateSections(lines);
     if (originalNumberOfSets < 1) {

@@ -38,13 +38,9 @@ std::string Fixed(std::initializer_list<double> values, int decimals) {
 int CIT8ReaderWriter::AppendMissingColumns(std::wstring sourcePath, std::wstring targetPath,
                                            bool exactCounts) {
     CIT8ReaderWriter source;
-    if (source.ReadChartFile(sourcePath) != 0) {
-        return 22;
-    }
     std::vector<std::string> lines;
-    const int readResult = ReadFileLines(sourcePath, lines);
-    if (readResult != 0) {
-        return readResult;
+    if (const int loaded = LoadSourceChart(sourcePath, source, lines); loaded != 0) {
+        return loaded;
     }
     const it8::ChartSections sections = it8::LocateSections(lines);
     if (originalNumberOfSets < 1) {

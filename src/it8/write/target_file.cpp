@@ -50,13 +50,9 @@ std::string RewriteLayoutLine(const std::string& line, int patchCount, int colum
 
 int CIT8ReaderWriter::WriteTargetFile(std::wstring sourcePath, std::wstring targetPath) {
     CIT8ReaderWriter source;
-    if (source.ReadChartFile(sourcePath) != 0) {
-        return 22;
-    }
     std::vector<std::string> lines;
-    const int readResult = ReadFileLines(sourcePath, lines);
-    if (readResult != 0) {
-        return readResult;
+    if (const int loaded = LoadSourceChart(sourcePath, source, lines); loaded != 0) {
+        return loaded;
     }
     std::vector<CColorPatch> selected;
     if (SelectCleanAndWhitePatches(selected, true)) {
