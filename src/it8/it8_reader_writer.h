@@ -87,7 +87,9 @@ private:
     std::uint32_t CountDataFields(std::uint32_t& setCount);
     /// The field names between BEGIN_DATA_FORMAT and END_DATA_FORMAT.
     std::string FormatDataFormatLine();
-    /// One data row per set; every non-empty list must hold `setCount` entries.
+    /// The data rows of sets 0 to setCount - 1 as one entry, rows separated by line
+    /// ends; nothing when a set's spectral or n-colour names differ from the first's.
+    /// Every non-empty list must hold `setCount` entries.
     void AppendDataRows(std::vector<std::string>& lines, std::uint32_t setCount);
     /// The template's lines with the store's columns appended: 0, 21, 23, 24.
     int AppendColumnsToFile(const std::wstring& templatePath, const std::wstring& targetPath);

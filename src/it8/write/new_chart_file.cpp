@@ -1,5 +1,8 @@
 // Writing a new chart file from the store's value lists alone.
+#include <algorithm>
+#include <array>
 #include <initializer_list>
+#include <map>
 #include <string>
 #include <vector>
 
@@ -8,16 +11,80 @@
 #include "it8/write/number_format.h"
 #include "it8/write/output_file.h"
 #include "it8/write/store_list_checks.h"
+#include "it8/write/text_builder.h"
 
 namespace {
 
-std::string FixedColumns(std::initializer_list<double> values) {
-    std::string text;
+// Each value as a tab and "%.2f".
+void AppendFixedColumns(it8::TextBuilder& text, std::initializer_list<double> values) {
     for (const double value : values) {
-        text += '\t';
-        text += it8::FormatFixed(value, 2);
+        text.Append('\t');
+        text.AppendFixed(value, 2);
     }
-    return text;
+}
+
+// The first row's keys, which name the spectral or n-colour columns.
+template <typename Key, typename Value>
+std::vector<Key> KeysOf(const std::vector<std::map<Key, Value>>& list) {
+    std::vector<Key> keys;
+    if (!list.empty()) {
+        for (const auto& entry : list.front()) {
+            keys.push_back(entry.first);
+        }
+    }
+    return keys;
+}
+
+// Rows are written in blocks of this many, whose spectral and n-colour maps
+// are read side by side: a map's entries lie apart in memory, and walking
+// several maps at once lets their reads overlap instead of each waiting for
+// the one before (for thousands of spectra, most of the writing time).
+constexpr std::size_t kBlockRows = 8;
+
+// The most room made for the data rows at once; beyond it the text grows as
+// it is written.
+constexpr std::size_t kMostRoomAtOnce = std::size_t{64} << 20;
+
+// The values of maps [first, first + count) of `list`, count at most
+// kBlockRows, into `values` row after row. False when a map's keys are not
+// exactly `keys`.
+template <typename Key, typename Value, typename Number>
+bool GatherBlock(const std::vector<std::map<Key, Value>>& list, std::size_t first,
+                 std::size_t count, const std::vector<Key>& keys, Number number,
+                 std::vector<double>& values) {
+    std::array<typename std::map<Key, Value>::const_iterator, kBlockRows> entries;
+    const std::size_t columns = keys.size();
+    for (std::size_t row = 0; row < count; ++row) {
+        if (list[first + row].size() != columns) {
+            return false;
+        }
+        entries[row] = list[first + row].begin();
+    }
+    values.resize(count * columns);
+    for (std::size_t column = 0; column < columns; ++column) {
+        for (std::size_t row = 0; row < count; ++row) {
+            if (entries[row]->first != keys[column]) {
+                return false;
+            }
+            values[row * columns + column] = number(entries[row]->second);
+            ++entries[row];
+        }
+    }
+    return true;
+}
+
+// A block row's map values: none for empty maps, else an extra tab, then a
+// tab and the value of each column.
+void AppendBlockColumns(it8::TextBuilder& text, const std::vector<double>& values, std::size_t row,
+                        std::size_t columns, int decimals) {
+    if (columns == 0) {
+        return;
+    }
+    text.Append('\t');
+    for (std::size_t column = 0; column < columns; ++column) {
+        text.Append('\t');
+        text.AppendFixed(values[row * columns + column], decimals);
+    }
 }
 
 } // namespace
@@ -120,58 +187,74 @@ std::string CIT8ReaderWriter::FormatDataFormatLine() {
 }
 
 // Every non-empty list must hold at least setCount entries (checked by
-// WriteNewChartFile before it calls this).
+// WriteNewChartFile before it calls this). The rows go into one entry of
+// `lines`, separated by line ends, so that thousands of rows cost neither a
+// string each nor a string per number. When a row's spectral names or n-colour
+// channels differ from the first row's, nothing is added, and
+// WriteNewChartFile refuses the chart.
 void CIT8ReaderWriter::AppendDataRows(std::vector<std::string>& lines, std::uint32_t setCount) {
+    const std::vector<int> channels = KeysOf(nColorList);
+    const std::vector<std::string> wavelengths = KeysOf(spectralList);
+    const auto channelValue = [](const tagNCLR& channel) { return channel.value; };
+    const auto spectralValue = [](double value) { return value; };
+    std::vector<double> channelValues;
+    std::vector<double> spectralValues;
+    it8::TextBuilder text;
     for (std::size_t i = 0; i < setCount; ++i) {
-        std::string row = it8::FormatInteger(static_cast<long long>(i) + 1);
+        const std::size_t row = i % kBlockRows;
+        if (row == 0) {
+            const std::size_t rows = std::min<std::size_t>(kBlockRows, setCount - i);
+            if ((!nColorList.empty() &&
+                 !GatherBlock(nColorList, i, rows, channels, channelValue, channelValues)) ||
+                (!spectralList.empty() &&
+                 !GatherBlock(spectralList, i, rows, wavelengths, spectralValue, spectralValues))) {
+                return;
+            }
+        }
+        if (i == 1) {
+            // Room for rows about as long as the first, made at once; capped,
+            // as an unusually long first row must not claim room for thousands.
+            text.Reserve(std::min(text.Size() * (setCount - 1) / 8 * 9, kMostRoomAtOnce));
+        }
+        if (i != 0) {
+            text.Append('\n');
+        }
+        text.AppendInteger(static_cast<long long>(i) + 1);
         if (!sampleNameList.empty()) {
-            row += '\t' + sampleNameList[i];
+            text.Append('\t');
+            text.Append(sampleNameList[i]);
         }
-        if (!nColorList.empty()) {
-            std::string channels;
-            for (const auto& channel : nColorList[i]) {
-                channels += '\t' + it8::FormatFixed(channel.second.value, 2);
-            }
-            if (!channels.empty()) {
-                row += '\t' + channels;
-            }
-        }
-        if (!spectralList.empty()) {
-            std::string spectrum;
-            for (const auto& field : spectralList[i]) {
-                spectrum += '\t' + it8::FormatFixed(field.second, 5);
-            }
-            if (!spectrum.empty()) {
-                row += '\t' + spectrum;
-            }
-        }
+        AppendBlockColumns(text, channelValues, row, channels.size(), 2);
+        AppendBlockColumns(text, spectralValues, row, wavelengths.size(), 5);
         if (!cmykList.empty()) {
             const tagCMYK& v = cmykList[i];
-            row += FixedColumns({v.c, v.m, v.y, v.k});
+            AppendFixedColumns(text, {v.c, v.m, v.y, v.k});
         }
         if (!cmykogList.empty()) {
             const tagCMYKOG& v = cmykogList[i];
-            row += FixedColumns({v.c, v.m, v.y, v.k, v.o, v.g});
+            AppendFixedColumns(text, {v.c, v.m, v.y, v.k, v.o, v.g});
         }
         if (!cmykrgbList.empty()) {
             const tagCMYKRGB& v = cmykrgbList[i];
-            row += FixedColumns({v.c, v.m, v.y, v.k, v.r, v.g, v.b});
+            AppendFixedColumns(text, {v.c, v.m, v.y, v.k, v.r, v.g, v.b});
         }
         if (!xyzList.empty()) {
             const tagXYZ& v = xyzList[i];
-            row += FixedColumns({v.x, v.y, v.z});
+            AppendFixedColumns(text, {v.x, v.y, v.z});
         }
         if (!labList.empty()) {
             const tagLAB& v = labList[i];
-            row += FixedColumns({v.l, v.a, v.b});
+            AppendFixedColumns(text, {v.l, v.a, v.b});
         }
         if (!rgbList.empty()) {
             const tagRGB& v = rgbList[i];
-            row += '\t' + it8::FormatInteger(v.r) + '\t' + it8::FormatInteger(v.g) + '\t' +
-                   it8::FormatInteger(v.b);
+            for (const int channel : {v.r, v.g, v.b}) {
+                text.Append('\t');
+                text.AppendInteger(channel);
+            }
         }
-        lines.push_back(std::move(row));
     }
+    lines.push_back(text.Take());
 }
 
 int CIT8ReaderWriter::WriteNewChartFile(const std::wstring& targetPath) {
@@ -182,8 +265,8 @@ int CIT8ReaderWriter::WriteNewChartFile(const std::wstring& targetPath) {
     if (!it8::ListCovers(sampleNameList, sets) || !it8::ListCovers(cmykList, sets) ||
         !it8::ListCovers(cmykogList, sets) || !it8::ListCovers(cmykrgbList, sets) ||
         !it8::ListCovers(xyzList, sets) || !it8::ListCovers(labList, sets) ||
-        !it8::ListCovers(rgbList, sets) || !it8::SpectralListCovers(spectralList, sets) ||
-        !it8::NColorListCovers(nColorList, sets)) {
+        !it8::ListCovers(rgbList, sets) || !it8::ListCovers(spectralList, sets) ||
+        !it8::ListCovers(nColorList, sets)) {
         return 24;
     }
 
@@ -205,7 +288,11 @@ int CIT8ReaderWriter::WriteNewChartFile(const std::wstring& targetPath) {
     lines.push_back("NUMBER_OF_SETS\t" + it8::FormatInteger(setCount));
     lines.emplace_back("BEGIN_DATA");
     if (setCount != 0) {
+        const std::size_t before = lines.size();
         AppendDataRows(lines, setCount);
+        if (lines.size() == before) {
+            return 24; // spectra or n-colour maps that differ from the first row's
+        }
     }
     lines.emplace_back("END_DATA");
 
