@@ -23,7 +23,12 @@ ensure_packages() {
         apt-get update -qq
         export REDAVUDEVA_APT_UPDATED=1
     fi
-    DEBIAN_FRONTEND=noninteractive apt-get install -y -qq --no-install-recommends "${missing[@]}" >/dev/null
+    # REDAVUDEVA_APT_RECOMMENDS=1 takes the packages' recommendations too.
+    local recommends=--no-install-recommends
+    if [ -n "${REDAVUDEVA_APT_RECOMMENDS:-}" ]; then
+        recommends=
+    fi
+    DEBIAN_FRONTEND=noninteractive apt-get install -y -qq $recommends "${missing[@]}" >/dev/null
 }
 
 # Packages every build needs.

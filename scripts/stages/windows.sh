@@ -6,8 +6,9 @@ set -euo pipefail
 cd "$(dirname "$0")/../.."
 source scripts/lib/common.sh
 
-ensure_packages cmake ninja-build googletest g++-mingw-w64-x86-64-posix binutils-mingw-w64-x86-64 \
-    wine wine64
+# Wine with its recommended packages, the set these tests were run with.
+REDAVUDEVA_APT_RECOMMENDS=1 ensure_packages cmake ninja-build googletest \
+    g++-mingw-w64-x86-64-posix binutils-mingw-w64-x86-64 wine wine64
 
 export LANG=C.UTF-8
 # A Wine configuration of our own, thrown away afterwards; no prompts to install
