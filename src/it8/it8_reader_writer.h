@@ -14,6 +14,10 @@
 #include "it8/read/chart_line_reader.h"
 #include "redavudeva/swatchlog_base.h"
 
+namespace it8 {
+struct ChartSections;
+}
+
 class CIT8ReaderWriter : public CSwatchlogBase {
 public:
     CIT8ReaderWriter();
@@ -97,4 +101,8 @@ private:
     /// chart) or 21 (cannot be opened).
     static int LoadSourceChart(const std::wstring& path, CIT8ReaderWriter& source,
                                std::vector<std::string>& lines);
+    /// LoadSourceChart for the merge writers, which then take the first set count
+    /// to be the set count when it is below 1 and need both sections: 0, 21, 22, 24.
+    int LoadMergeSource(const std::wstring& path, CIT8ReaderWriter& source,
+                        std::vector<std::string>& lines, it8::ChartSections& sections);
 };

@@ -68,13 +68,3 @@ int CIT8ReaderWriter::ReadFileLines(std::wstring path, std::vector<std::string>&
     }
     return 0;
 }
-
-int CIT8ReaderWriter::LoadSourceChart(const std::wstring& path, CIT8ReaderWriter& source,
-                                      std::vector<std::string>& lines) {
-    // The chart tells which colour spaces and patches the file holds; the lines
-    // are what the writer edits.
-    if (source.ReadChartFile(path) != 0) {
-        return 22;
-    }
-    return ReadFileLines(path, lines);
-}

@@ -35,15 +35,9 @@ double ChannelValue(const std::map<int, tagNCLR>& channels, int channel) {
 int CIT8ReaderWriter::WriteMeasurementFile(std::wstring sourcePath, std::wstring targetPath) {
     CIT8ReaderWriter source;
     std::vector<std::string> lines;
-    if (const int loaded = LoadSourceChart(sourcePath, source, lines); loaded != 0) {
+    it8::ChartSections sections;
+    if (const int loaded = LoadMergeSource(sourcePath, source, lines, sections); loaded != 0) {
         return loaded;
-    }
-    const it8::ChartSections sections = it8::LocateSections(lines);
-    if (originalNumberOfSets < 1) {
-        originalNumberOfSets = numberOfSets;
-    }
-    if (!sections.usable) {
-        return 24;
     }
     const std::size_t rows = sections.rowCount;
     if (numberOfSets < 0 || rows != static_cast<std::size_t>(numberOfSets) ||

@@ -39,15 +39,9 @@ int CIT8ReaderWriter::AppendMissingColumns(std::wstring sourcePath, std::wstring
                                            bool exactCounts) {
     CIT8ReaderWriter source;
     std::vector<std::string> lines;
-    if (const int loaded = LoadSourceChart(sourcePath, source, lines); loaded != 0) {
+    it8::ChartSections sections;
+    if (const int loaded = LoadMergeSource(sourcePath, source, lines, sections); loaded != 0) {
         return loaded;
-    }
-    const it8::ChartSections sections = it8::LocateSections(lines);
-    if (originalNumberOfSets < 1) {
-        originalNumberOfSets = numberOfSets;
-    }
-    if (!sections.usable) {
-        return 24;
     }
     const long long firstSets = originalNumberOfSets;
     const long long fileRows = static_cast<long long>(sections.rowCount);
