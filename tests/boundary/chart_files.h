@@ -43,10 +43,7 @@ protected:
     /// Writes the chart to `name` and reads it: the result of ReadChartFile.
     int Read(const std::string& fields, const std::vector<std::string>& rows,
              const std::vector<std::string>& header = {}, const std::string& name = "chart.txt") {
-        return ReadText(ChartText(fields, rows, header), name);
-    }
-    int ReadText(const std::string& text, const std::string& name = "chart.txt") {
-        lastPath = dir.write(name, text);
+        lastPath = dir.write(name, ChartText(fields, rows, header));
         return host->ReadChartFile(test_support::Wide(lastPath));
     }
 
@@ -72,15 +69,6 @@ inline std::vector<double> Values(const tagXYZ& v) {
 }
 inline std::vector<double> Values(const tagLAB& v) {
     return {v.l, v.a, v.b};
-}
-inline std::vector<double> Values(const tagRGB& v) {
-    return {double(v.r), double(v.g), double(v.b)};
-}
-inline std::vector<double> Values(const tagCMYKRGB& v) {
-    return {v.c, v.m, v.y, v.k, v.r, v.g, v.b};
-}
-inline std::vector<double> Values(const tagCMYKOGV& v) {
-    return {v.c, v.m, v.y, v.k, v.o, v.g, v.v};
 }
 inline std::vector<double> Values(const tagDENSITY& v) {
     return {v.red, v.green, v.blue, v.visual, v.majorFilter};

@@ -1,4 +1,4 @@
-// Device colour space, channel count, device values and process colour names of
+// Device colour space, channel count and process colour names of
 // charts read from files, asked through the base-class interface a host holds.
 // The reader's own tests cover each kind of chart; these check that a host gets
 // the reader-writer's answers, not the store's fallbacks, and the mixed charts.
@@ -12,7 +12,6 @@
 namespace {
 
 using namespace host_charts;
-using Lists = std::vector<std::vector<double>>;
 
 using HostDeviceQueries = HostChart;
 
@@ -23,31 +22,22 @@ TEST_F(HostDeviceQueries, SpaceChannelsAndValuesPerKindOfChart) {
         std::vector<std::string> rows;
         int space;
         int channels;
-        Lists lists; // none: the chart has no device values, answer 12
     };
     const Case cases[] = {
         {"SAMPLE_ID CMYK_C CMYK_M CMYK_Y CMYK_K LAB_L LAB_A LAB_B",
          {"1 0 10 20 30 95 -1 2", "2 100 0 0 0 55 -37 -50"},
          COLORSPACE_CMYK,
-         4,
-         {{0, 10, 20, 30}, {100, 0, 0, 0}}},
+         4},
         // An HTML colour answers CMYK's number even beside n-colour channels; the
-        // channel count and the values still follow the n-colour channels.
-        {"SAMPLE_ID DRGB 3CLR_1 3CLR_2 3CLR_3",
-         {"1 #102030 5 6 7"},
-         COLORSPACE_CMYK,
-         3,
-         {{5, 6, 7}}},
+        // channel count still follows the n-colour channels.
+        {"SAMPLE_ID DRGB 3CLR_1 3CLR_2 3CLR_3", {"1 #102030 5 6 7"}, COLORSPACE_CMYK, 3},
         // The last row's colour decides for the chart: here it is no HTML colour.
-        {rgbHtml, {"1 1 2 3 #010203", "2 4 5 6 010203"}, COLORSPACE_RGB, 3, {}},
+        {rgbHtml, {"1 1 2 3 #010203", "2 4 5 6 010203"}, COLORSPACE_RGB, 3},
     };
     for (const Case& c : cases) {
         ASSERT_EQ(Read(c.fields, c.rows), 0) << c.fields;
         EXPECT_EQ(host->GetDeviceColorSpace(), c.space) << c.fields;
         EXPECT_EQ(host->GetDeviceChannelCount(), c.channels) << c.fields;
-        Lists lists{{-1.0}};
-        EXPECT_EQ(host->GetDeviceValueLists(lists), c.lists.empty() ? 12 : 0) << c.fields;
-        EXPECT_EQ(lists, c.lists) << c.fields;
     }
 }
 
@@ -68,7 +58,6 @@ TEST_F(HostDeviceQueries, ProcessColourNames) {
         8);
     EXPECT_EQ(host->GetProcessColorNames(names), 1);
     EXPECT_TRUE(names.empty());
-    EXPECT_EQ(host->GetDeviceColorSpace(), -1);
 }
 
 } // namespace

@@ -2,7 +2,6 @@
 // the value lists, seen through the patches and the files written afterwards.
 #include <gtest/gtest.h>
 
-#include <cmath>
 #include <map>
 #include <string>
 #include <utility>
@@ -14,7 +13,6 @@ namespace {
 
 using namespace host_charts;
 
-// First line after `marker` in `text` ("" when there is none).
 // A written file's text with the platform's CR LF line ends read as LF.
 std::string WithoutCR(std::string text) {
     for (auto cr = text.find('\r'); cr != std::string::npos; cr = text.find('\r', cr)) {
@@ -23,6 +21,7 @@ std::string WithoutCR(std::string text) {
     return text;
 }
 
+// First line after `marker` in `text` ("" when there is none).
 std::string LineAfter(std::string text, const std::string& marker) {
     text = WithoutCR(std::move(text));
     const auto at = text.find(marker + "\n");
@@ -45,12 +44,6 @@ using HostEdits = HostChart;
 TEST_F(HostEdits, ChartNormLightReachesEveryPatchAndRecomputesNothing) {
     // Patch 1 is the default norm light (96.38, 100, 82.45), patch 2 half of it.
     ASSERT_EQ(Read("SAMPLE_ID XYZ_X XYZ_Y XYZ_Z", {"1 96.38 100 82.45", "2 48.19 50 41.225"}), 0);
-    // Lab read against the default norm light: every ratio is 0.5 for patch 2, so
-    // L* = 116 * 0.5^(1/3) - 16 = 116 * 0.79370052598 - 16 = 76.06926101, a* = b* = 0.
-    tagLAB lab;
-    ASSERT_EQ(host->GetPatchLAB(2, lab), 0);
-    ExpectNear(Values(lab), {76.06926101415557, 0, 0});
-
     const tagXYZ light{48.19, 50, 41.225};
     host->SetChartNormLight(light);
     for (int sample : {1, 2}) {
@@ -60,15 +53,12 @@ TEST_F(HostEdits, ChartNormLightReachesEveryPatchAndRecomputesNothing) {
         // Scaling a patch's own XYZ as media white gives back its norm light.
         ExpectNear(Values(patch.XYZAbsoluteToRelative(patch.GetXYZ())), Values(light));
     }
-    // Nothing is recomputed: the stored Lab stays as read.
+    // Nothing is recomputed: the Lab stays as read against the default norm light,
+    // where every ratio is 0.5 for patch 2, so
+    // L* = 116 * 0.5^(1/3) - 16 = 116 * 0.79370052598 - 16 = 76.06926101, a* = b* = 0.
+    tagLAB lab;
     ASSERT_EQ(host->GetPatchLAB(2, lab), 0);
     ExpectNear(Values(lab), {76.06926101415557, 0, 0});
-
-    // Reading again gives patches with the default norm light.
-    ASSERT_EQ(ReadText(test_support::ReadBytes(lastPath)), 0);
-    int result = -1;
-    CColorPatch patch = host->GetPatch(2, result);
-    ExpectNear(Values(patch.XYZAbsoluteToRelative(patch.GetXYZ())), {96.38, 100, 82.45});
 }
 
 TEST_F(HostEdits, ClearListsKeepsSampleNamesAndDensities) {
@@ -86,25 +76,10 @@ TEST_F(HostEdits, ClearListsKeepsSampleNamesAndDensities) {
     host->SetNColorList({{{0, tagNCLR{1, 0, "1CLR_1", 5}}}, {{0, tagNCLR{1, 0, "1CLR_1", 6}}}});
     host->SetKeywordList({{"ORIGINATOR", "host"}});
     host->SetSpectralDataList({spectrum, spectrum}, true); // XYZ, Lab and densities
-    // The lists change neither the patches nor what the chart carries.
-    tagCMYK cmyk;
-    ASSERT_EQ(host->GetPatchCMYK(1, cmyk), 0);
-    EXPECT_EQ(Values(cmyk), (std::vector<double>{0, 10, 20, 30}));
-    EXPECT_FALSE(host->IsColorSpacePresent(COLORSPACE_RGB));
-    EXPECT_FALSE(host->IsColorSpacePresent(COLORSPACE_XYZ));
-
-    // Before clearing, the merge writer shows the computed measurements.
-    const auto merged = dir.file("merged.txt");
-    ASSERT_EQ(host->WriteMeasurementFile(test_support::Wide(lastPath), test_support::Wide(merged)),
-              0);
-    const std::string before = LineAfter(test_support::ReadBytes(merged), "BEGIN_DATA_FORMAT");
-    EXPECT_NE(before.find("LAB_L"), std::string::npos) << before;
-    EXPECT_NE(before.find("XYZ_X"), std::string::npos) << before;
-    EXPECT_NE(before.find("D_RED"), std::string::npos) << before;
-
     host->ClearLists();
 
     // The densities stay: the merged file still carries them, and nothing else of the store.
+    const auto merged = dir.file("merged.txt");
     ASSERT_EQ(host->WriteMeasurementFile(test_support::Wide(lastPath), test_support::Wide(merged)),
               0);
     EXPECT_EQ(LineAfter(test_support::ReadBytes(merged), "BEGIN_DATA_FORMAT"),
@@ -116,7 +91,6 @@ TEST_F(HostEdits, ClearListsKeepsSampleNamesAndDensities) {
     ASSERT_EQ(host->WriteChartFile(L"", test_support::Wide(fresh), false), 0);
     const std::string written = WithoutCR(test_support::ReadBytes(fresh));
     EXPECT_EQ(LineAfter(written, "BEGIN_DATA_FORMAT"), "SAMPLE_ID\tSAMPLE_NAME");
-    EXPECT_NE(written.find("NUMBER_OF_FIELDS\t2\n"), std::string::npos) << written;
     EXPECT_NE(written.find("NUMBER_OF_SETS\t0\n"), std::string::npos) << written;
     EXPECT_EQ(written.find("ORIGINATOR"), std::string::npos) << written;
 }

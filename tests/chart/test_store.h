@@ -1,5 +1,5 @@
 // A chart store without a file format, for what a read chart cannot reach: the
-// file operations do nothing, and tests put patches, keywords and masks
+// file operations do nothing, and tests put patches and masks
 // straight into the store.
 #pragma once
 
@@ -28,36 +28,15 @@ public:
     int WriteTargetFile(std::wstring, std::wstring) override { return 0; }
 
     using CSwatchlogBase::AnalyseSpectralKeys;
-    using CSwatchlogBase::ResetChart;
     using CSwatchlogBase::SetKeyword;
     using CSwatchlogBase::UpdatePresenceFlags;
 
-    using CSwatchlogBase::borderPatches;
     using CSwatchlogBase::channelCount;
-    using CSwatchlogBase::cmykList;
     using CSwatchlogBase::densityList;
-    using CSwatchlogBase::device;
-    using CSwatchlogBase::filePath;
-    using CSwatchlogBase::hasCMYKO;
     using CSwatchlogBase::keywordList;
-    using CSwatchlogBase::keywordMap;
     using CSwatchlogBase::labList;
-    using CSwatchlogBase::missingColorSpaces;
-    using CSwatchlogBase::normLight;
-    using CSwatchlogBase::numberOfCols;
-    using CSwatchlogBase::numberOfFields;
-    using CSwatchlogBase::numberOfPages;
-    using CSwatchlogBase::numberOfSets;
-    using CSwatchlogBase::numberOfStrips;
-    using CSwatchlogBase::originalNumberOfSets;
     using CSwatchlogBase::patches;
-    using CSwatchlogBase::patchesPerPage;
-    using CSwatchlogBase::referenceSampleMap;
-    using CSwatchlogBase::sampleNameList;
-    using CSwatchlogBase::spectralList;
-    using CSwatchlogBase::uvCutMode;
     using CSwatchlogBase::xyzList;
-    using CSwatchlogBase::zebraRulerMode;
 };
 
 namespace test_patches {

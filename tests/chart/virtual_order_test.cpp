@@ -7,81 +7,64 @@
 #include <cstdint>
 #include <cstring>
 #include <iterator>
+#include <utility>
 
 #include "redavudeva/swatchlog_base.h"
 
 namespace {
 
 template <typename MemberPointer> long VtableSlot(MemberPointer member) {
-    struct Representation {
-        std::uintptr_t pointer;
-        std::ptrdiff_t adjustment;
-    };
-    static_assert(sizeof(MemberPointer) == sizeof(Representation), "Itanium member pointer");
-    Representation rep;
-    std::memcpy(&rep, &member, sizeof rep);
-    if ((rep.pointer & 1u) == 0) {
-        return -1; // not a virtual function
-    }
-    return static_cast<long>((rep.pointer - 1) / sizeof(void*));
+    std::uintptr_t rep[2]; // Itanium: pointer or 1 + vtable offset, then this-adjustment
+    static_assert(sizeof(MemberPointer) == sizeof rep, "Itanium member pointer");
+    std::memcpy(rep, &member, sizeof rep);
+    return (rep[0] & 1u) == 0 ? -1 : static_cast<long>((rep[0] - 1) / sizeof(void*));
 }
 
 using B = CSwatchlogBase;
 using StringPairs = std::vector<std::pair<std::string, std::string>>;
-
-struct Slot {
-    long slot;
-    const char* name;
-};
+using Slot = std::pair<long, const char*>;
 // clang-format off
 #define SLOT(member) Slot{VtableSlot(member), #member}
+#define S(name) SLOT(&B::name)
 // clang-format on
 
 TEST(VirtualOrder, EveryOperationSitsInItsDeclaredSlot) {
     // In declared order: entry i must be slot i + 2.
     // clang-format off
     const Slot slots[] = {
-        SLOT(&B::ReadChartFile), SLOT(&B::AppendColumnsWithWhitePoint), SLOT(&B::WriteChartFile),
-        SLOT(&B::WriteMeasurementFile), SLOT(&B::AppendMissingColumns), SLOT(&B::InsertKeywords),
-        SLOT(&B::CanReadFile), SLOT(&B::WriteTargetFile), SLOT(&B::GetPatchCount),
-        SLOT(&B::GetNumberOfCols), SLOT(&B::GetNumberOfStrips), SLOT(&B::GetNumberOfPages),
-        SLOT(&B::GetDevice), SLOT(&B::GetPatchesPerPage), SLOT(&B::GetKeywords),
-        SLOT(&B::GetKeywordValue), SLOT(&B::GetPatch),
+        S(ReadChartFile), S(AppendColumnsWithWhitePoint), S(WriteChartFile),
+        S(WriteMeasurementFile), S(AppendMissingColumns), S(InsertKeywords), S(CanReadFile),
+        S(WriteTargetFile), S(GetPatchCount), S(GetNumberOfCols), S(GetNumberOfStrips),
+        S(GetNumberOfPages), S(GetDevice), S(GetPatchesPerPage), S(GetKeywords), S(GetKeywordValue),
+        S(GetPatch),
         SLOT(static_cast<int (B::*)(const tagCMYK&, double)>(&B::FindClosestPatch)),
         SLOT(static_cast<int (B::*)(const tagCMYK&)>(&B::FindClosestPatch)),
         SLOT(static_cast<int (B::*)(const tagCMYKOG&, double)>(&B::FindClosestPatch)),
         SLOT(static_cast<int (B::*)(const tagCMYKOG&)>(&B::FindClosestPatch)),
         SLOT(static_cast<int (B::*)(const tagCMYKRGB&, double)>(&B::FindClosestPatch)),
         SLOT(static_cast<int (B::*)(const tagCMYKRGB&)>(&B::FindClosestPatch)),
-        SLOT(&B::GetPatchCMYK), SLOT(&B::GetPatchCMYKOG), SLOT(&B::GetPatchCMYKRGB),
-        SLOT(&B::GetPatchXYZ), SLOT(&B::GetPatchLAB), SLOT(&B::GetPatchRGB),
-        SLOT(&B::GetPatchDensity), SLOT(&B::CollectCMYK), SLOT(&B::CollectCMYKOG),
-        SLOT(&B::CollectCMYKO), SLOT(&B::CollectCMYKOGV), SLOT(&B::CollectCMYKRGB),
-        SLOT(&B::CollectXYZ), SLOT(&B::CollectLAB), SLOT(&B::CollectRGB),
-        SLOT(&B::CollectHTMLCOLOR), SLOT(&B::CollectNColorMaps), SLOT(&B::GetDeviceValueLists),
-        SLOT(&B::CollectDensities), SLOT(&B::SetLayout), SLOT(&B::SetNumberOfPages),
-        SLOT(&B::CollectStripRGB), SLOT(&B::CollectStripLAB), SLOT(&B::CollectStripXYZ),
-        SLOT(&B::CollectStripCMYKOGV), SLOT(&B::CollectStripCMYKRGB), SLOT(&B::CollectStripCMYKO),
-        SLOT(&B::CollectStripCMYKOG), SLOT(&B::CollectStripCMYK), SLOT(&B::GetPatchList),
-        SLOT(&B::GetSpectralDataList), SLOT(&B::GetSpectralRange), SLOT(&B::IsColorSpacePresent),
-        SLOT(&B::GetDeviceColorSpace), SLOT(&B::GetDeviceChannelCount), SLOT(&B::GetChartType),
-        SLOT(&B::SetChartType), SLOT(&B::WriteDeviceControlSequence),
-        SLOT(&B::SelectCMYKRGBGradient), SLOT(&B::SelectCMYKOGGradient),
-        SLOT(&B::SelectCMYKGradient), SLOT(&B::SelectCleanAndWhitePatches),
-        SLOT(&B::SelectCleanColorPatches), SLOT(&B::GroupCleanColorPatches),
-        SLOT(&B::GetChannelRamps), SLOT(&B::SetChartNormLight),
+        S(GetPatchCMYK), S(GetPatchCMYKOG), S(GetPatchCMYKRGB), S(GetPatchXYZ), S(GetPatchLAB),
+        S(GetPatchRGB), S(GetPatchDensity), S(CollectCMYK), S(CollectCMYKOG), S(CollectCMYKO),
+        S(CollectCMYKOGV), S(CollectCMYKRGB), S(CollectXYZ), S(CollectLAB), S(CollectRGB),
+        S(CollectHTMLCOLOR), S(CollectNColorMaps), S(GetDeviceValueLists), S(CollectDensities),
+        S(SetLayout), S(SetNumberOfPages), S(CollectStripRGB), S(CollectStripLAB),
+        S(CollectStripXYZ), S(CollectStripCMYKOGV), S(CollectStripCMYKRGB), S(CollectStripCMYKO),
+        S(CollectStripCMYKOG), S(CollectStripCMYK), S(GetPatchList), S(GetSpectralDataList),
+        S(GetSpectralRange), S(IsColorSpacePresent), S(GetDeviceColorSpace),
+        S(GetDeviceChannelCount), S(GetChartType), S(SetChartType), S(WriteDeviceControlSequence),
+        S(SelectCMYKRGBGradient), S(SelectCMYKOGGradient), S(SelectCMYKGradient),
+        S(SelectCleanAndWhitePatches), S(SelectCleanColorPatches), S(GroupCleanColorPatches),
+        S(GetChannelRamps), S(SetChartNormLight),
         SLOT(static_cast<void (B::*)(const StringPairs&)>(&B::SetKeywordList)),
-        SLOT(&B::SetSampleNameList), SLOT(&B::SetCMYKList), SLOT(&B::SetCMYKOGList),
-        SLOT(&B::SetCMYKRGBList), SLOT(&B::SetCMYKOGVList), SLOT(&B::SetXYZList),
-        SLOT(&B::SetLABList), SLOT(&B::SetRGBList), SLOT(&B::SetSpectralDataList),
-        SLOT(&B::SetNColorList), SLOT(&B::AddKeyword), SLOT(&B::GetDataFormatLine),
-        SLOT(&B::SetDataFormatLine), SLOT(&B::ClearLists), SLOT(&B::GetReferenceSampleMap),
-        SLOT(&B::GetProcessColorNames),
+        S(SetSampleNameList), S(SetCMYKList), S(SetCMYKOGList), S(SetCMYKRGBList),
+        S(SetCMYKOGVList), S(SetXYZList), S(SetLABList), S(SetRGBList), S(SetSpectralDataList),
+        S(SetNColorList), S(AddKeyword), S(GetDataFormatLine), S(SetDataFormatLine), S(ClearLists),
+        S(GetReferenceSampleMap), S(GetProcessColorNames),
     };
     // clang-format on
     ASSERT_EQ(std::size(slots), 86u); // 87 operations less the destructor
     for (std::size_t i = 0; i < std::size(slots); ++i) {
-        EXPECT_EQ(slots[i].slot, static_cast<long>(i) + 2) << slots[i].name;
+        EXPECT_EQ(slots[i].first, static_cast<long>(i) + 2) << slots[i].second;
     }
 }
 

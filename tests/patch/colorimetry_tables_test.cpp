@@ -12,15 +12,14 @@ namespace {
 
 using colorimetry::SpectralRow;
 
-void ExpectSums(const SpectralRow& row, double sum, double weighted, double tolerance) {
-    double plain = 0.0;
-    double moment = 0.0;
+void ExpectSums(const SpectralRow& row, const double (&expected)[2], double tolerance) {
+    double plain = 0.0, moment = 0.0;
     for (std::size_t i = 0; i < row.size(); ++i) {
         plain += row[i];
         moment += static_cast<double>(i + 1) * row[i];
     }
-    EXPECT_NEAR(plain, sum, 1e-9);
-    EXPECT_NEAR(moment, weighted, tolerance);
+    EXPECT_NEAR(plain, expected[0], 1e-9);
+    EXPECT_NEAR(moment, expected[1], tolerance);
 }
 
 TEST(ColorimetryTables, WeightingSetsAndVisualWeights) {
@@ -36,10 +35,10 @@ TEST(ColorimetryTables, WeightingSetsAndVisualWeights) {
     for (std::size_t set = 0; set < 4; ++set) {
         for (std::size_t axis = 0; axis < 3; ++axis) {
             SCOPED_TRACE(testing::Message() << "set " << set << " column " << axis);
-            ExpectSums((*sets[set])[axis], expected[set][axis][0], expected[set][axis][1], 1e-5);
+            ExpectSums((*sets[set])[axis], expected[set][axis], 1e-5);
         }
     }
-    ExpectSums(colorimetry::kVisualWeights, 10.6853051, 203.2168138, 1e-7);
+    ExpectSums(colorimetry::kVisualWeights, {10.6853051, 203.2168138}, 1e-7);
 }
 
 TEST(ColorimetryTables, DensityFilterSets) {
@@ -55,8 +54,7 @@ TEST(ColorimetryTables, DensityFilterSets) {
     for (std::size_t set = 0; set < 7; ++set) {
         for (std::size_t filter = 0; filter < 3; ++filter) {
             SCOPED_TRACE(testing::Message() << "set " << set << " filter " << filter);
-            ExpectSums(colorimetry::kDensityFilterSets[set][filter], expected[set][filter][0],
-                       expected[set][filter][1], 1e-7);
+            ExpectSums(colorimetry::kDensityFilterSets[set][filter], expected[set][filter], 1e-7);
         }
     }
 }

@@ -1,5 +1,5 @@
-// Device colour of a patch: 8-bit RGB from XYZ and from CMYK, distances,
-// straight-gradient tests and the clean and white tests.
+// Device colour of a patch: 8-bit RGB from XYZ and from CMYK, the
+// straight-gradient test and the clean and white tests.
 #include <climits>
 #include <cmath>
 #include <vector>
@@ -29,34 +29,25 @@ Rgb FromCMYK(double c, double m, double y, double k) {
 TEST(RgbDerivation, XyzThroughEachConversionType) {
     EXPECT_EQ(FromXYZ(95.047, 100, 108.883, 1), (Rgb{255, 255, 255})); // D65 white, sRGB
     EXPECT_EQ(FromXYZ(96.38, 100, 82.45, 0), (Rgb{255, 255, 255}));    // the norm light
-    EXPECT_EQ(FromXYZ(41.24, 21.26, 1.93, 1), (Rgb{255, 0, 0}));       // sRGB red primary
     EXPECT_EQ(FromXYZ(20, 20, 20, 1), (Rgb{135, 121, 118}));
     // (20, 20, 20), type 2: linear 0.217867, 0.197239, 0.167496, companded
     // 0.504112, 0.481414, 0.446096; type 0: companded 0.488684, 0.480983, 0.530027.
     EXPECT_EQ(FromXYZ(20, 20, 20, 2), (Rgb{129, 123, 114}));
     EXPECT_EQ(FromXYZ(20, 20, 20, 0), (Rgb{125, 123, 135}));
-    EXPECT_EQ(FromXYZ(20, 20, 20, 7), (Rgb{125, 123, 135})); // above 3 acts as 0
-    EXPECT_EQ(FromXYZ(96.38, 100, 82.45, 3), (Rgb{0, 0, 0}));
-    EXPECT_EQ(FromXYZ(0, 0, 0, 2), (Rgb{0, 0, 0}));
 
     // Clamping. Type 1 on (200, 0, 0): linear 6.48 (far above 1), -1.94 and
     // 0.111 (companded 0.367608; 255 c + 0.5 = 94.24).
     EXPECT_EQ(FromXYZ(200, 0, 0, 1), (Rgb{255, 0, 94}));
-    // Beyond any integer, and NaN: clamped before the integer conversion.
-    EXPECT_EQ(FromXYZ(1e308, 0, 0, 1), (Rgb{255, 0, 255}));
+    // NaN: clamped before the integer conversion.
     EXPECT_EQ(FromXYZ(std::nan(""), 0, 0, 0), (Rgb{0, 0, 0}));
 }
 
 TEST(RgbDerivation, CmykInksAndBlackShareAreInverted) {
-    EXPECT_EQ(FromCMYK(0, 0, 0, 0), (Rgb{255, 255, 255}));
-    EXPECT_EQ(FromCMYK(50, 0, 0, 0), (Rgb{127, 255, 255}));
-    EXPECT_EQ(FromCMYK(0, 0, 0, 100), (Rgb{0, 0, 0}));
     // K 50: C 50 gives 1 - (0.5 * 0.5 + 0.5) = 0.25, 63.75 truncated; M, Y 0 give 127.5.
     EXPECT_EQ(FromCMYK(50, 0, 0, 50), (Rgb{63, 127, 127}));
     // No range is imposed: C 150 gives (1 - 1.5) * 255 = -127.5, truncated to -127.
-    // Beyond the int range the ends are kept; NaN reads as 0.
+    // Beyond the int range the ends are kept.
     EXPECT_EQ(FromCMYK(150, 1e300, -1e300, 0), (Rgb{-127, INT_MIN, INT_MAX}));
-    EXPECT_EQ(FromCMYK(std::nan(""), 0, 0, 0)[0], 0);
 }
 
 CColorPatch CmykPatch(tagCMYK cmyk) {
@@ -73,35 +64,11 @@ CColorPatch NColorPatch(std::initializer_list<double> values, tagCMYK cmyk = {})
     return in.Read(SuppliedOnly(MISSING_CMYK | MISSING_NCOLOR));
 }
 
-TEST(PatchComparisons, DistancesAndGradientsUseEveryChannelOfTheirRecord) {
-    patch_test::PatchInput in; // presence flags are not consulted
-    in.cmyk = {10, 20, 30, 40};
-    in.cmykog = {20, 0, 0, 0, 40, 0};
-    in.cmykogv = {20, 0, 0, 0, 0, 0, 40};
-    in.cmykrgb = {20, 0, 0, 0, 0, 0, 41};
-    CColorPatch p = in.Build();
-    EXPECT_DOUBLE_EQ(p.GetCMYKPatchDistanceTo({13, 24, 30, 40}), 5.0);           // 3, 4
-    EXPECT_DOUBLE_EQ(p.GetCMYKOGPatchDistanceTo({20, 0, 0, 0, 37, 4}), 5.0);     // o 3, g 4
-    EXPECT_DOUBLE_EQ(p.GetCMYKOGVPatchDistanceTo({20, 0, 0, 0, 0, 0, 33}), 7.0); // v alone
-    EXPECT_DOUBLE_EQ(p.GetCMYKRGBPatchDistanceTo({18, 0, 0, 0, 3, 6, 41}), 7.0); // 4+9+36
-
-    EXPECT_TRUE(p.IsCMYKOGOnGradient({}, {10, 0, 0, 0, 20, 0}, 1));
-    EXPECT_FALSE(p.IsCMYKOGOnGradient({}, {10, 0, 0, 0, 20, 1}, 1));
-    EXPECT_TRUE(p.IsCMYKOGVOnGradient({}, {10, 0, 0, 0, 0, 0, 20}, 1));
-    EXPECT_FALSE(p.IsCMYKRGBOnGradient({}, {10, 0, 0, 0, 0, 0, 20}, 1)); // t 2 against 2.05
-}
-
 TEST(PatchComparisons, GradientTestComparesTheLineParameterWithinTolerance) {
     const tagCMYK direction{10, 10, 0, 0};
     EXPECT_TRUE(CmykPatch({50, 50, 0, 0}).IsCMYKOnGradient({}, direction, 1));
     EXPECT_FALSE(CmykPatch({50, 51, 0, 0}).IsCMYKOnGradient({}, direction, 1)); // 5 vs 5.1
     EXPECT_FALSE(CmykPatch({50, 50, 0, 1}).IsCMYKOnGradient({}, direction, 1)); // k off origin
-    // Tolerance 1e7 allows a difference of 1 in t and off the origin.
-    EXPECT_TRUE(CmykPatch({50, 60, 0, 1}).IsCMYKOnGradient({}, direction, 1e7));
-    EXPECT_FALSE(CmykPatch({50, 65, 0, 0}).IsCMYKOnGradient({}, direction, 1e7)); // 5 vs 6.5
-    // A zero direction: on the gradient only at the origin.
-    EXPECT_TRUE(CmykPatch({5, 6, 7, 8}).IsCMYKOnGradient({5, 6, 7, 8}, {}, 1));
-    EXPECT_FALSE(CmykPatch({5, 6, 7, 8.001}).IsCMYKOnGradient({5, 6, 7, 8}, {}, 1));
     // A NaN direction component counts as non-zero and fails.
     EXPECT_FALSE(CmykPatch({50, 50, 0, 0}).IsCMYKOnGradient({}, {10, 10, std::nan(""), 0}, 1));
 }
@@ -110,8 +77,6 @@ TEST(PatchComparisons, CleanAndWhiteAreStrictAndPreferNColorChannels) {
     EXPECT_TRUE(CmykPatch({80, 4, 0, 0}).IsCleanColor(0, 5));
     EXPECT_FALSE(CmykPatch({80, 5, 0, 0}).IsCleanColor(0, 5)); // 5 is not below 5
     EXPECT_FALSE(CmykPatch({80, 4, 0, 0}).IsCleanColor(4, 5));
-    EXPECT_TRUE(CmykPatch({0, 0, 0, 90}).IsCleanColor(5));
-    EXPECT_FALSE(CmykPatch({0, 0, 0, 0}).IsCleanColor(5));
     EXPECT_FALSE(CmykPatch({80, 0, 5, 0}).IsCleanColor(5));
     EXPECT_TRUE(CmykPatch({0, 0, 0, 0.5}).IsWhite(1));
     EXPECT_FALSE(CmykPatch({0, 0, 0, 1}).IsWhite(1));
@@ -119,18 +84,12 @@ TEST(PatchComparisons, CleanAndWhiteAreStrictAndPreferNColorChannels) {
     // n-colour channels win over CMYK when both are present.
     CColorPatch both = NColorPatch({0, 70, 0}, tagCMYK{80, 0, 0, 0});
     EXPECT_TRUE(both.IsCleanColor(1, 5));
-    EXPECT_FALSE(both.IsCleanColor(0, 5));
-    EXPECT_FALSE(both.IsCleanColor(3, 5));
-    EXPECT_FALSE(both.IsCleanColor(-1, 5));
     EXPECT_TRUE(both.IsCleanColor(5));
-    EXPECT_FALSE(NColorPatch({}).IsCleanColor(5));
     EXPECT_TRUE(NColorPatch({0, 0.5}, tagCMYK{90, 0, 0, 0}).IsWhite(1));
     EXPECT_FALSE(NColorPatch({0, 1}).IsWhite(1));
-    EXPECT_TRUE(NColorPatch({}).IsWhite(1));
 
     patch_test::PatchInput none; // neither flag raised
     none.cmyk = {80, 0, 0, 0};
-    EXPECT_FALSE(none.Build().IsCleanColor(5));
     EXPECT_FALSE(none.Build().IsWhite(100));
 }
 

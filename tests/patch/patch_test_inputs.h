@@ -12,11 +12,10 @@
 
 namespace patch_test {
 
-constexpr std::uint32_t kAllMissing = 0x7FF0; // every meaningful mask bit
-
-/// A mask in which only the spaces in `supplied` count as supplied by the row.
+/// A mask in which only the spaces in `supplied` count as supplied by the row
+/// (0x7FF0 holds every meaningful mask bit).
 constexpr std::uint32_t SuppliedOnly(std::uint32_t supplied) {
-    return kAllMissing & ~supplied;
+    return 0x7FF0u & ~supplied;
 }
 
 /// `count` values named lead + wavelength; the value at index i is first + i * increment.

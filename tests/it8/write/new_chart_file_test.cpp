@@ -1,4 +1,4 @@
-// The new-file writer: field order, number formats, set counts and a read back
+// The new-file writer: field order, number formats, a long name and a read back
 // through the reader; writers under a decimal-comma locale.
 #include <gtest/gtest.h>
 
@@ -42,59 +42,6 @@ TEST(NewChartFile, WritesTheTwoSetExampleByteForByte) {
     std::vector<std::vector<double>> cmyk;
     ASSERT_EQ(reader.GetDeviceValueLists(cmyk), 0);
     EXPECT_EQ(cmyk, (std::vector<std::vector<double>>{{100, 0, 0, 0}, {0, 100, 0, 0}}));
-    tagLAB lab;
-    ASSERT_EQ(reader.GetPatchLAB(2, lab), 0);
-    EXPECT_EQ(std::vector<double>({lab.l, lab.a, lab.b}), std::vector<double>({48, 74, -3}));
-    int result = -1;
-    EXPECT_EQ(reader.GetPatch(2, result).GetLabel(), "B");
-}
-
-TEST(NewChartFile, KeywordsAndMeasurementBlocksInTheirFixedOrder) {
-    TempDir dir;
-    CIT8ReaderWriter chart;
-    chart.SetKeywordList({{"ORIGINATOR", "\"Redavudeva test\""}, {"CREATED", "\"2026-12-06\""}});
-    chart.SetNColorList(
-        {{{0, tagNCLR{5, 0, "5CLR_1", 10.5}}, {1, tagNCLR{5, 1, "5CLR_2", 0}}},
-         {{0, tagNCLR{5, 0, "5CLR_1", 99.994}}, {1, tagNCLR{5, 1, "5CLR_2", 100}}}});
-    chart.SetSpectralDataList({{{"SPECTRAL_NM_390", 1.0}, {"SPECTRAL_NM_380", 0.123456}},
-                               {{"SPECTRAL_NM_390", 0.5}, {"SPECTRAL_NM_380", 0.0000149}}},
-                              false);
-    chart.SetXYZList({tagXYZ{41.25, 50, 8.5}, tagXYZ{0, -0.5, 1234.5678}});
-    chart.SetRGBList({tagRGB{255, 0, 12}, tagRGB{0, 128, 255}});
-    ASSERT_EQ(WriteNew(chart, dir.file("out.txt")), 0);
-    // Fields 2 + 2 + 3 + 3 + 1 = 11; no device list, so XYZ decides 2 sets.
-    // n-colour and spectral blocks each stand after an empty position; spectral
-    // values carry five decimals (0.123456 -> 0.12346, 0.0000149 -> 0.00001),
-    // RGB none.
-    EXPECT_EQ(
-        ReadBytes(dir.file("out.txt")),
-        FileText({"ORIGINATOR\t\"Redavudeva test\"", "CREATED\t\"2026-12-06\"",
-                  "NUMBER_OF_FIELDS\t11", "BEGIN_DATA_FORMAT",
-                  "SAMPLE_ID\t\t5CLR_1\t5CLR_2\t\tSPECTRAL_NM_380\tSPECTRAL_NM_390\tXYZ_X\tXYZ_"
-                  "Y\tXYZ_Z\tRGB_R\tRGB_G\tRGB_B",
-                  "END_DATA_FORMAT", "NUMBER_OF_SETS\t2", "BEGIN_DATA",
-                  "1\t\t10.50\t0.00\t\t0.12346\t1.00000\t41.25\t50.00\t8.50\t255\t0\t12",
-                  "2\t\t99.99\t100.00\t\t0.00001\t0.50000\t0.00\t-0.50\t1234.57\t0\t128\t255",
-                  "END_DATA"}));
-}
-
-TEST(NewChartFile, DeviceListsDecideTheSetCount) {
-    TempDir dir;
-    CIT8ReaderWriter sixColour;
-    sixColour.SetCMYKList({tagCMYK{1, 0, 0, 0}, tagCMYK{2, 0, 0, 0}, tagCMYK{3, 0, 0, 0}});
-    tagCMYKOG six;
-    six.o = 40;
-    sixColour.SetCMYKOGList({six, six});
-    ASSERT_EQ(WriteNew(sixColour, dir.file("six.txt")), 0);
-    // The later device list (two six-colour entries) wins over three CMYK entries.
-    EXPECT_EQ(
-        ReadBytes(dir.file("six.txt")),
-        FileText({"IT8", "NUMBER_OF_FIELDS\t11", "BEGIN_DATA_FORMAT",
-                  "SAMPLE_ID\tCMYK_C\tCMYK_M\tCMYK_Y\tCMYK_K\t\t6CLR_1\t6CLR_2\t6CLR_3\t6CLR_"
-                  "4\t6CLR_5\t6CLR_6",
-                  "END_DATA_FORMAT", "NUMBER_OF_SETS\t2", "BEGIN_DATA",
-                  "1\t1.00\t0.00\t0.00\t0.00\t0.00\t0.00\t0.00\t0.00\t40.00\t0.00",
-                  "2\t2.00\t0.00\t0.00\t0.00\t0.00\t0.00\t0.00\t0.00\t40.00\t0.00", "END_DATA"}));
 }
 
 TEST(NewChartFile, EmptyStoreWritesSevenLinesAlsoUnderALongName) {
