@@ -61,38 +61,19 @@ TEST(DeltaE2000, MatchesThePublishedTestDataBothWays) {
     }
 }
 
-TEST(Bradford, AdaptsD50ToD65AsPublished) {
-    // The D50 to D65 Bradford matrix as commonly tabulated for these whites, to seven decimals.
-    const Matrix3 expected{{{0.9555766, -0.0230393, 0.0631636},
-                            {-0.0282895, 1.0099416, 0.0210077},
-                            {0.0122982, -0.0204830, 1.3299098}}};
-    const Matrix3 m = BradfordAdaptation(kWhiteD50, kWhiteD65);
-    for (int i = 0; i < 9; ++i) {
-        EXPECT_NEAR(m[i / 3][i % 3], expected[i / 3][i % 3], 5e-7) << i;
-    }
-}
-
 std::vector<int> Channels(const Rgb8& c) {
     return {c.r, c.g, c.b};
 }
 
-TEST(Srgb, DisplayColoursOfXyzLabAndCmyk) {
+TEST(Srgb, DisplayColoursOfXyzAdaptedAndClipped) {
     // A grey of Y = 0.2 (D50 white adapts to D65 white): 1.055 * 0.2^(1/2.4) - 0.055 =
     // 0.4845292, times 255 = 123.555.
     const XyzColor grey{0.2 * kWhiteD50.x, 0.2, 0.2 * kWhiteD50.z};
     EXPECT_EQ(Channels(SrgbFromXyzD50(grey)), (std::vector<int>{124, 124, 124}));
-    // Below 0.0031308 the curve is 12.92 v.
-    EXPECT_NEAR(CompandSrgb(0.002), 0.02584, 1e-12);
     // A saturated green has negative linear red and blue: clipped to 0, not wrapped.
     const Rgb8 green = SrgbFromXyzD50({0.1, 0.5, 0.05});
     EXPECT_EQ(green.r + green.b, 0);
     EXPECT_GT(green.g, 200);
-    // Below L* 8 the linear branch Y = L* * 27 / 24389.
-    EXPECT_NEAR(XyzFromLabD50({5, 0, 0}).y, 135.0 / 24389.0, 1e-12);
-    // Without colorimetry, cyan 50 leaves red at 255 * 0.5 = 127.5; black 100 is black
-    // whatever the other inks, also beyond 0..100.
-    EXPECT_EQ(Channels(RgbFromCmykPercent(50, 0, 0, 0)), (std::vector<int>{128, 255, 255}));
-    EXPECT_EQ(Channels(RgbFromCmykPercent(20, 130, -5, 100)), (std::vector<int>{0, 0, 0}));
 }
 
 } // namespace
