@@ -32,7 +32,7 @@ ensure_packages() {
 }
 
 # Packages every build needs.
-BUILD_PACKAGES=(cmake ninja-build g++ clang libgtest-dev libbenchmark-dev liblcms2-dev pkg-config jq python3
+BUILD_PACKAGES=(cmake ninja-build g++ clang libgtest-dev libbenchmark-dev liblcms2-dev pkg-config jq python3 acl
     argyll-ref colord-data)
 
 section() {
