@@ -48,6 +48,32 @@ using NColorMap = std::map<int, tagNCLR>;
 /// 19 channel out of range; 21 source unreadable; 22 source not a readable chart;
 /// 23 target cannot be written; 24 store data do not fit the source; 25 no
 /// reference samples.
+///
+/// Reading a chart file (ReadChartFile, and the source of every writer):
+/// - Only a regular file is read; a folder, a device or a pipe answers 3 (21 as a
+///   writer's source) without a byte being read. The file is read whole, with its
+///   length taken when it is opened.
+/// - A UTF-8 byte-order mark at the start is skipped.
+/// - Line ends: a file whose first line (up to its first LF) holds at most 1023
+///   characters is read with LF line ends (a CR before an LF belongs to the line
+///   end, any other CR separates tokens). A longer first line with a CR within
+///   its first 1023 characters, or a file without any LF that holds a CR, is read
+///   with CR line ends. Lines may be of any length; a NUL ends a line.
+/// - Limits that keep memory proportional to the file: a field name of the data
+///   format longer than 1023 characters answers 5; a data row answers 8 unless it
+///   holds at least as many values as the format has spectral and n-colour
+///   fields (every patch carries its own copy of those names). Peak memory while
+///   reading is then at most about 1.1 KiB per byte of the file (a patch is about
+///   1 KiB, the shortest row is two bytes) plus the file itself.
+///
+/// Writing a target (every writer): whether it may be written is decided by
+/// opening it for writing; a symbolic link is followed, a loop answers 23. A new
+/// target appears only when complete. An existing target keeps its owner, group,
+/// mode, hard links, access lists and extended attributes: where replacing it
+/// by a renamed temporary file would lose any of these (and always on Windows)
+/// it is rewritten in place. On failure (23) the target holds its old content,
+/// or, when that could not be read or put back, is left empty; it never holds a
+/// part of the new text. A source may also be the target.
 class CSwatchlogBase {
 public:
     CSwatchlogBase();

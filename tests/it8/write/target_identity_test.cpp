@@ -65,7 +65,6 @@ TEST(TargetIdentity, HardLinksShareTheNewContent) {
     ASSERT_EQ(WriteHelperChart(target), 0);
     EXPECT_EQ(ReadBytes(other), HelperChartText());
     EXPECT_TRUE(fs::equivalent(target, other));
-    EXPECT_EQ(fs::hard_link_count(target), 2u);
 
     // Source and target the same path, written in place.
     CIT8ReaderWriter chart;
