@@ -21,9 +21,9 @@ TEST_F(ToolTest, ConvertWritesACleanChartThatReadsBackWithTheSameValues) {
     EXPECT_EQ(FileCount(), 2u); // nothing left behind
     ExpectIn(Read("out dir ü.it8"), {"KEYWORD\t\"PRESS\"\nPRESS\t\"sheetfed press\""});
     EXPECT_EQ(Tsv("out dir ü.it8", "cmyk,lab"),
-              "SAMPLE\tNAME\tCMYK_C\tCMYK_M\tCMYK_Y\tCMYK_K\tLAB_L\tLAB_A\tLAB_B\n"
-              "1\tA\t100.00\t0.00\t0.00\t0.00\t55.00\t-37.00\t-50.00\n"
-              "2\tB\t0.00\t100.00\t0.00\t0.00\t48.00\t74.00\t-3.00\n");
+              "SAMPLE\tSAMPLE_ID\tNAME\tCMYK_C\tCMYK_M\tCMYK_Y\tCMYK_K\tLAB_L\tLAB_A\tLAB_B\n"
+              "1\t1\tA\t100.00\t0.00\t0.00\t0.00\t55.00\t-37.00\t-50.00\n"
+              "2\t2\tB\t0.00\t100.00\t0.00\t0.00\t48.00\t74.00\t-3.00\n");
 }
 
 TEST_F(ToolTest, MergePutsTheMeasurementsIntoTheTarget) {
@@ -39,9 +39,9 @@ TEST_F(ToolTest, TargetKeepsCleanPatchesAndTheWhite) {
     dir.write("target.it8", kTarget);
     Ok({"target", "target.it8", "-o", "clean.it8"});
     // Cyan alone is clean, blue (cyan and magenta) is not, paper is the white.
-    EXPECT_EQ(Tsv("clean.it8", "cmyk"), "SAMPLE\tNAME\tCMYK_C\tCMYK_M\tCMYK_Y\tCMYK_K\n"
-                                        "1\t\t100.00\t0.00\t0.00\t0.00\n"
-                                        "2\t\t0.00\t0.00\t0.00\t0.00\n");
+    EXPECT_EQ(Tsv("clean.it8", "cmyk"), "SAMPLE\tSAMPLE_ID\tNAME\tCMYK_C\tCMYK_M\tCMYK_Y\tCMYK_K\n"
+                                        "1\t1\t\t100.00\t0.00\t0.00\t0.00\n"
+                                        "2\t2\t\t0.00\t0.00\t0.00\t0.00\n");
 }
 
 TEST_F(ToolTest, KeywordsGoRightAfterTheIdentification) {
