@@ -88,6 +88,16 @@ TEST_F(ToolTest, EveryTableOfAFileOfSeveralIsReadable) {
         EXPECT_EQ(run.status, c.status);
         ExpectIn(run.err, {c.message});
     }
+    // A real file: FograStrip3.ti1's first table names 8 fields against its own
+    // NUMBER_OF_FIELDS 9; the other two tables read.
+    const RunResult strip = Tool({"validate", "/usr/share/color/argyll/ref/FograStrip3.ti1"});
+    if (strip.err.find("cannot be opened") == std::string::npos) {
+        EXPECT_EQ(strip.status, 1);
+        ExpectIn(strip.err, {"FograStrip3.ti1, table 1: the data format on line 17 names 8 "
+                             "different fields but NUMBER_OF_FIELDS on line 16 is 9 [code 5]"});
+        ExpectIn(strip.out, {"FograStrip3.ti1, table 2: ok, 8 patches (CMYK, XYZ)",
+                             "FograStrip3.ti1, table 3: ok, 9 patches (CMYK, XYZ)"});
+    }
 }
 
 TEST_F(ToolTest, ValidateSaysWhatIsWrongWithLineNumbers) {
@@ -108,6 +118,33 @@ TEST_F(ToolTest, ValidateSaysWhatIsWrongWithLineNumbers) {
              {"row 2 (line 10) has 10 values but NUMBER_OF_FIELDS is 9: the quoted value "
               "\"Cyan 100\" (line 10, column 3) holds a blank, and values are separated at blanks "
               "even inside double quotes, so it counts as 2 values [code 8]"});
+}
+
+TEST_F(ToolTest, ValidateWarnsOfValuesThatDoNotReadAsWritten) {
+    // Line 9 on: what each cell of LAB_L (column 13) or LAB_A (column 17) holds.
+    dir.write("values.it8",
+              LabChart({"1 a 0 0 0 0 n/a 0 0", "2 b 0 0 0 0 75.25.3 0 0", "3 c 0 0 0 0 nan inf 0",
+                        "4 d 0 0 0 0 1e308 0 0", "5 e 0 0 0 0 50 -0,5 0"}));
+    const RunResult run = Tool({"validate", "values.it8"});
+    EXPECT_EQ(run.status, 0);
+    EXPECT_EQ(run.out, "values.it8: ok, 5 patches (CMYK, L*a*b*), 5 warnings\n");
+    // The values the reader takes: text reads as 0; "75.25.3" stops at the second
+    // point, then reads again with the first point as a comma, which stops at once: 75.
+    EXPECT_EQ(run.err,
+              "swatchlog validate: warning: values.it8: line 9, column 13: LAB_L of sample 1 holds "
+              "the text \"n/a\"; it reads as 0\n"
+              "swatchlog validate: warning: values.it8: line 10, column 13: LAB_L of sample 2 is "
+              "\"75.25.3\", not a well-formed number; it reads as 75\n"
+              "swatchlog validate: warning: values.it8: line 11, column 13: LAB_L of sample 3 is "
+              "\"nan\", not a finite number; it reads as nan\n"
+              "swatchlog validate: warning: values.it8: line 11, column 17: LAB_A of sample 3 is "
+              "\"inf\", not a finite number; it reads as inf\n"
+              "swatchlog validate: warning: values.it8: line 12, column 13: LAB_L of sample 4 is "
+              "1e308, outside 0 to 100\n");
+    const RunResult strict = Tool({"validate", "--strict", "values.it8"});
+    EXPECT_EQ(strict.status, 1);
+    EXPECT_EQ(strict.out, "");
+    ExpectIn(strict.err, {"values.it8: 5 values fail the strict checks"});
 }
 
 } // namespace
