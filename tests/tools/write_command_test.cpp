@@ -35,6 +35,59 @@ TEST_F(ToolTest, MergePutsTheMeasurementsIntoTheTarget) {
                                              "\t0.00\t0.00\t0.00\t0.00\t95.00\t0.75\t-2.00\n"});
 }
 
+TEST_F(ToolTest, MergePairsBySampleIdAndRefusesMeasurementsOfAnotherChart) {
+    dir.write("target.it8", kTarget);
+    // The measurements in another row order, with their device values; and one
+    // patch the target does not have.
+    dir.write("reordered.it8",
+              "CGATS.17\nBEGIN_DATA_FORMAT\nSAMPLE_ID CMYK_C CMYK_M CMYK_Y CMYK_K LAB_L LAB_A "
+              "LAB_B\nEND_DATA_FORMAT\nNUMBER_OF_SETS 4\nBEGIN_DATA\n3 0 0 0 0 95 0.75 -2\n"
+              "1 100 0 0 0 55.25 -37.5 -50\n4 0 0 0 100 10 0 0\n2 100 100 0 0 24 20.5 -48\n"
+              "END_DATA\n");
+    std::string rows;
+    for (int i = 1; i <= 48; ++i) {
+        rows += std::to_string(i) + " p" + std::to_string(i) + " " + std::to_string(i) + " 0 0 0\n";
+    }
+    dir.write("target48.it8", "CGATS.17\nBEGIN_DATA_FORMAT\nSAMPLE_ID SAMPLE_NAME CMYK_C CMYK_M "
+                              "CMYK_Y CMYK_K\nEND_DATA_FORMAT\nNUMBER_OF_SETS 48\nBEGIN_DATA\n" +
+                                  rows + "END_DATA\n");
+    dir.write("measured.it8", kMeasured);
+    const struct {
+        std::string message;
+        std::vector<std::string> args;
+    } refusals[] = {
+        {"1 of 4 patches of reordered.it8 (sample 3) has no partner in target.it8 by SAMPLE_ID; "
+         "--allow-unpaired leaves them out",
+         {"merge", "target.it8", "reordered.it8"}},
+        // By row position the device values show that the pairs are wrong.
+        {"3 of 3 pairs by position differ in their CMYK values by more than 1: sample 1 "
+         "(SAMPLE_ID 1) of target.it8 has CMYK 100 0 0 0, sample 1 (SAMPLE_ID 3) of "
+         "reordered.it8 has CMYK 0 0 0 0",
+         {"merge", "target.it8", "reordered.it8", "--by", "position", "--allow-unpaired"}},
+        // Three measurements do not make a 48-patch target a 3-patch one.
+        {"45 of 48 patches of target48.it8 (samples 4-48) have no partner in measured.it8 by "
+         "SAMPLE_ID; every target patch needs a measurement, so nothing was written",
+         {"merge", "target48.it8", "measured.it8", "--append-missing"}},
+    };
+    for (const auto& c : refusals) {
+        auto args = c.args;
+        args.insert(args.end(), {"-o", "out.it8"});
+        const RunResult run = Tool(args);
+        EXPECT_EQ(run.status, 1) << run.err;
+        ExpectIn(run.err, {c.message});
+        EXPECT_FALSE(std::filesystem::exists(dir.file("out.it8")));
+    }
+    const RunResult run =
+        Tool({"merge", "target.it8", "reordered.it8", "--allow-unpaired", "-o", "merged.it8"});
+    EXPECT_EQ(run.status, 0) << run.err;
+    ExpectIn(run.err, {"left out 1 of 4 patches of reordered.it8 that have no target patch "
+                       "(sample 3)"});
+    ExpectIn(Tsv("merged.it8", "cmyk,lab"),
+             {"1\t1\t\t100.00\t0.00\t0.00\t0.00\t55.25\t-37.50\t-50.00\n"
+              "2\t2\t\t100.00\t100.00\t0.00\t0.00\t24.00\t20.50\t-48.00\n"
+              "3\t3\t\t0.00\t0.00\t0.00\t0.00\t95.00\t0.75\t-2.00\n"});
+}
+
 TEST_F(ToolTest, TargetKeepsCleanPatchesAndTheWhite) {
     dir.write("target.it8", kTarget);
     Ok({"target", "target.it8", "-o", "clean.it8"});
@@ -81,7 +134,9 @@ TEST_F(ToolTest, AFailedWriteLeavesNoOutputAndAnExistingOneUntouched) {
         std::string message;
         std::vector<std::string> args;
     } cases[] = {
-        {1, "target has 3 patches but mixed.it8 has 2", {"merge", "target.it8", "mixed.it8"}},
+        {1,
+         "1 of 3 patches of target.it8 (sample 3) has no partner in mixed.it8 by SAMPLE_ID",
+         {"merge", "target.it8", "mixed.it8"}},
         {1, "no clean and no white patch", {"target", "mixed.it8"}},
         {2, "", {"keywords", "target.it8", "TWO WORDS=1"}},
     };
