@@ -97,6 +97,23 @@ TEST_F(ToolTest, TargetKeepsCleanPatchesAndTheWhite) {
                                         "2\t2\t\t0.00\t0.00\t0.00\t0.00\n");
 }
 
+TEST_F(ToolTest, TargetRefusesToLoseTheCleanPatchesAfterAWhiteOne) {
+    dir.write("white first.it8", LabChart({"1 paper 0 0 0 0 95 0 -2", "2 cyan 100 0 0 0 55 -37 -50",
+                                           "3 magenta 0 100 0 0 48 74 -3"}));
+    const std::string why = "the target would keep 1 of the 3 clean and white patches: the target "
+                            "writer stops at the first white patch, sample 1 (paper), and leaves "
+                            "out 2 clean patches after it (samples 2-3)";
+    const RunResult refused = Tool({"target", "white first.it8", "-o", "out.it8"});
+    EXPECT_EQ(refused.status, 1);
+    ExpectIn(refused.err, {why + "; --force writes it anyway"});
+    EXPECT_FALSE(std::filesystem::exists(dir.file("out.it8")));
+    const RunResult forced = Tool({"target", "white first.it8", "-o", "out.it8", "--force"});
+    EXPECT_EQ(forced.status, 0);
+    ExpectIn(forced.err, {"warning: white first.it8: " + why});
+    EXPECT_EQ(Tsv("out.it8", "cmyk"), "SAMPLE\tSAMPLE_ID\tNAME\tCMYK_C\tCMYK_M\tCMYK_Y\tCMYK_K\n"
+                                      "1\t1\t\t0.00\t0.00\t0.00\t0.00\n");
+}
+
 TEST_F(ToolTest, KeywordsGoRightAfterTheIdentification) {
     dir.write("in.it8", kTarget);
     Ok({"keywords", "in.it8", "-o", "out.it8", "PRINT_CONDITIONS=ISO coated", "PRESS_SPEED=12000"});
