@@ -114,6 +114,41 @@ TEST_F(ToolTest, TargetRefusesToLoseTheCleanPatchesAfterAWhiteOne) {
                                       "1\t1\t\t0.00\t0.00\t0.00\t0.00\n");
 }
 
+TEST_F(ToolTest, ConvertListsWhatItChangesAndDrops) {
+    // RGB 99.2353 is kept as 99 from the reading on; XYZ_X 12.3456 is written
+    // as 12.35 (a change of 0.0044); R380 ... are no field the format knows.
+    dir.write("in.ti3", "CTI3\nORIGINATOR \"tool test\"\n# measured twice\n"
+                        "KEYWORD \"SPECTRAL_BANDS\"\nSPECTRAL_BANDS \"3\"\n"
+                        "KEYWORD \"WEIGHTING_FUNCTION\"\nWEIGHTING_FUNCTION \"ILLUMINANT, D50\"\n"
+                        "WEIGHTING_FUNCTION \"OBSERVER, 2 degree\"\nBEGIN_DATA_FORMAT\n"
+                        "SAMPLE_ID SAMPLE_LOC RGB_R RGB_G RGB_B XYZ_X XYZ_Y XYZ_Z R380 R390 R400\n"
+                        "END_DATA_FORMAT\nNUMBER_OF_SETS 2\nBEGIN_DATA\n"
+                        "A1 \"x1\" 99.2353 50 0 12.3456 20 30 0.1 0.2 0.3\n"
+                        "A2 \"x2\" 10 20 30 40 50 60 0.4 0.5 0.6\nEND_DATA\n");
+    const RunResult run = Tool({"convert", "in.ti3", "-o", "out.it8"});
+    EXPECT_EQ(run.status, 0) << run.err;
+    ExpectIn(run.err,
+             {"changed: the identification CTI3 is replaced by CGATS.17",
+              "dropped: 1 comment line\n",
+              "dropped: keywords that describe spectral fields, which are not written: "
+              "SPECTRAL_BANDS\n",
+              "changed: SAMPLE_ID: 2 ids replaced by the row numbers 1 to 2 (--keep-ids keeps the "
+              "file's own)\n",
+              "changed: SAMPLE_LOC is written as SAMPLE_NAME\n",
+              "dropped: 3 fields the new-file format has no columns for (2 values each): R380, "
+              "R390, R400\n",
+              "changed: RGB: 1 of 6 values have decimals and are written as the whole numbers the "
+              "chart holds, cut toward zero (99.2353 as 99)\n",
+              "changed: XYZ: 1 of 6 values rounded to 2 decimals (largest change 0.0044)\n",
+              "added: L*a*b*, derived by the library"});
+    // Repeated keywords stay, as the file has them.
+    ExpectIn(Read("out.it8"), {"KEYWORD\t\"WEIGHTING_FUNCTION\"\nWEIGHTING_FUNCTION\t\"ILLUMINANT, "
+                               "D50\"\nWEIGHTING_FUNCTION\t\"OBSERVER, 2 degree\"\n"});
+    EXPECT_EQ(Read("out.it8").find("SPECTRAL_BANDS"), std::string::npos);
+    Ok({"convert", "in.ti3", "-o", "ids.it8", "--keep-ids"});
+    ExpectIn(Tsv("ids.it8", "xyz"), {"1\tA1\tx1\t12.35\t20.00\t30.00\n2\tA2\tx2\t"});
+}
+
 TEST_F(ToolTest, KeywordsGoRightAfterTheIdentification) {
     dir.write("in.it8", kTarget);
     Ok({"keywords", "in.it8", "-o", "out.it8", "PRINT_CONDITIONS=ISO coated", "PRESS_SPEED=12000"});
