@@ -149,6 +149,31 @@ TEST_F(ToolTest, ConvertListsWhatItChangesAndDrops) {
     ExpectIn(Tsv("ids.it8", "xyz"), {"1\tA1\tx1\t12.35\t20.00\t30.00\n2\tA2\tx2\t"});
 }
 
+TEST_F(ToolTest, KeywordsKeepTheIdentificationAndReplaceValuesInPlace) {
+    for (const std::string end : {"\n", "\r\n"}) {
+        const std::vector<std::string> lines{"CTI3",
+                                             "DESCRIPTOR \"old\"",
+                                             "NUMBER_OF_FIELDS 2",
+                                             "BEGIN_DATA_FORMAT",
+                                             "SAMPLE_ID LAB_L",
+                                             "END_DATA_FORMAT",
+                                             "NUMBER_OF_SETS 1",
+                                             "BEGIN_DATA",
+                                             "1 50",
+                                             "END_DATA"};
+        std::string in;
+        for (const auto& line : lines) {
+            in += line + end;
+        }
+        dir.write("in.ti3", in);
+        Ok({"keywords", "in.ti3", "-o", "out.ti3", "DESCRIPTOR=new one", "NOTE=x"});
+        std::string expected = in;
+        expected.replace(expected.find("\"old\""), 5, "\"new one\"");
+        expected.insert(4 + end.size(), "KEYWORD\t\"NOTE\"" + end + "NOTE\t\"x\"" + end);
+        EXPECT_EQ(Read("out.ti3"), expected);
+    }
+}
+
 TEST_F(ToolTest, KeywordsGoRightAfterTheIdentification) {
     dir.write("in.it8", kTarget);
     Ok({"keywords", "in.it8", "-o", "out.it8", "PRINT_CONDITIONS=ISO coated", "PRESS_SPEED=12000"});
