@@ -157,6 +157,19 @@ TEST(ChartTables, ErrorsNameTheFileTheTableAndTheLine) {
         }
     }
     EXPECT_EQ(LoadTable(path, 1).Chart().GetPatchCount(), 2); // the first table is sound
+    // A spectral field name without a wavelength: the library's read ends with
+    // a standard exception, whose message the error keeps.
+    const std::string noWavelength =
+        dir.write("nm.it8", "CGATS.17\nBEGIN_DATA_FORMAT\nSAMPLE_ID NM_380\nEND_DATA_FORMAT\n"
+                            "NUMBER_OF_SETS 1\nBEGIN_DATA\n1 0.5\nEND_DATA\n")
+            .u8string();
+    try {
+        LoadTable(noWavelength);
+        ADD_FAILURE() << "NM_380 read";
+    } catch (const TableReadError& error) {
+        EXPECT_EQ(error.LibraryException(), "invalid stol argument");
+        EXPECT_EQ(error.Code(), 0);
+    }
     try {
         LoadTable(dir.file("missing.it8").u8string());
         ADD_FAILURE() << "a missing file read";

@@ -250,7 +250,7 @@ LoadedTable LoadTable(const std::string& utf8Path, int number) {
         code = loaded.chart_->ReadChartFile(loaded.libraryPath_);
     } catch (const std::exception& error) {
         throw TableReadError(where + ": " + DescribeLibraryException(error), 0, utf8Path,
-                             tableNumber, 0);
+                             tableNumber, 0, error.what());
     }
     if (code != 0) {
         const ChartScan scan = ScanChartText(loaded.lines_->Text(), loaded.firstLine_);

@@ -40,20 +40,26 @@ struct TableExtent {
 /// file, the table (for files of several tables) and the line where known.
 class TableReadError : public ChartError {
 public:
-    TableReadError(const std::string& message, int code, std::string path, int table, int line)
-        : ChartError(message), code_(code), path_(std::move(path)), table_(table), line_(line) {}
+    TableReadError(const std::string& message, int code, std::string path, int table, int line,
+                   std::string libraryException = "")
+        : ChartError(message), code_(code), path_(std::move(path)), table_(table), line_(line),
+          libraryException_(std::move(libraryException)) {}
     /// The library's result code (3 cannot open, 5 data format ... 9 no data),
     /// or 0 for a failure that has none (a bad table number, an exception).
     int Code() const { return code_; }
     const std::string& Path() const { return path_; }
     int Table() const { return table_; } ///< 0 when the file has one table
     int Line() const { return line_; }   ///< 0 when unknown
+    /// The message of the standard exception the library's read ended with
+    /// ("invalid stol argument", "invalid string position" ...), else empty.
+    const std::string& LibraryException() const { return libraryException_; }
 
 private:
     int code_;
     std::string path_;
     int table_;
     int line_;
+    std::string libraryException_;
 };
 
 /// The tables of chart text, in file order; at least one (text without any

@@ -29,7 +29,7 @@ const char* const kCompareHelp =
     "  --by RULE         how patches are paired. auto (default): by SAMPLE_ID when\n"
     "                    both files carry it, else by sample name when both name\n"
     "                    every patch once, else by position, saying which; id, name\n"
-    "                    or position: by that rule alone\n"
+    "                    or position (also called sample): by that rule alone\n"
     "  --allow-unpaired  compare the pairs found although patches are left without\n"
     "                    a partner or without L*a*b*; without it that is an error\n"
     "  --force           compare although the headers state different illuminants,\n"
