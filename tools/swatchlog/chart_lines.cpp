@@ -1,5 +1,7 @@
 #include "chart_lines.h"
 
+#include <cstring>
+
 namespace swatchlog {
 namespace {
 
@@ -28,9 +30,10 @@ ChartLines::ChartLines(std::string text) : text_(std::move(text)) {
         } else if (crOnly && next < text_.size() && text_[next] == '\n') {
             ++next;
         }
-        const std::size_t nul = text_.find('\0', position);
-        if (nul < position + length) {
-            length = nul - position;
+        const void* nul = std::memchr(text_.data() + position, '\0', length);
+        if (nul != nullptr) {
+            length =
+                static_cast<std::size_t>(static_cast<const char*>(nul) - text_.data()) - position;
         }
         lines_.push_back({position, length});
         position = next;
@@ -61,6 +64,25 @@ std::vector<LineToken> SplitTokens(std::string_view line) {
         }
     }
     return tokens;
+}
+
+std::string_view TokenAt(std::string_view line, std::size_t index) {
+    std::size_t i = 0;
+    for (std::size_t n = 0;; ++n) {
+        while (i < line.size() && IsSeparator(line[i])) {
+            ++i;
+        }
+        const std::size_t start = i;
+        while (i < line.size() && !IsSeparator(line[i])) {
+            ++i;
+        }
+        if (i == start) {
+            return {};
+        }
+        if (n == index) {
+            return line.substr(start, i - start);
+        }
+    }
 }
 
 std::vector<std::string> SplitWords(std::string_view line) {

@@ -44,6 +44,8 @@ struct LineToken {
 
 /// The values of a line, split at blanks, tabs, CR and LF.
 std::vector<LineToken> SplitTokens(std::string_view line);
+/// Value `index` (0-based) of a line, empty when the line has fewer values.
+std::string_view TokenAt(std::string_view line, std::size_t index);
 /// The same, as strings.
 std::vector<std::string> SplitWords(std::string_view line);
 /// Upper case of the ASCII letters, as the reader compares field names.

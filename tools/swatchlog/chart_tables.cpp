@@ -1,9 +1,9 @@
 #include "chart_tables.h"
 
+#include <algorithm>
 #include <chrono>
 #include <filesystem>
 #include <fstream>
-#include <iterator>
 #include <random>
 #include <system_error>
 
@@ -64,7 +64,20 @@ std::string ReadWholeFile(const std::string& utf8Path) {
         throw TableReadError(RepairUtf8(utf8Path) + ": " + WithCode(DescribeReadResult(3), 3), 3,
                              utf8Path, 0, 0);
     }
-    std::string text((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
+    // The size is a hint taken up to 1 GiB; a file that grew, shrank or has no
+    // size (a pipe, a device) is read to its end in pieces.
+    std::string text;
+    const auto size = fs::file_size(path, ec);
+    std::size_t piece = std::size_t{1} << 20;
+    if (!ec && size < (std::uintmax_t{1} << 30)) {
+        piece = std::max(piece, static_cast<std::size_t>(size) + 1);
+    }
+    while (in.good()) {
+        const std::size_t before = text.size();
+        text.resize(before + piece);
+        in.read(text.data() + before, static_cast<std::streamsize>(piece));
+        text.resize(before + static_cast<std::size_t>(in.gcount()));
+    }
     if (in.bad()) {
         throw TableReadError(RepairUtf8(utf8Path) + ": " + WithCode(DescribeReadResult(3), 3), 3,
                              utf8Path, 0, 0);
@@ -134,7 +147,9 @@ private:
 LoadedTable::LoadedTable(LoadedTable&&) noexcept = default;
 LoadedTable& LoadedTable::operator=(LoadedTable&&) noexcept = default;
 LoadedTable::~LoadedTable() {
-    // The chart object goes before the file it read.
+    // The text goes first, while few small blocks wait to be merged by the
+    // allocator; the chart object goes before the temporary file it read.
+    lines_.reset();
     chart_.reset();
 }
 
@@ -198,10 +213,7 @@ std::vector<std::string> LoadedTable::ColumnText(const std::string& field) const
         return cells;
     }
     for (const std::size_t line : text_.rowLines) {
-        const auto tokens = SplitTokens(lines_->Line(line));
-        cells.push_back(static_cast<std::size_t>(column) < tokens.size()
-                            ? Unquoted(tokens[static_cast<std::size_t>(column)].text)
-                            : std::string());
+        cells.push_back(Unquoted(TokenAt(lines_->Line(line), static_cast<std::size_t>(column))));
     }
     return cells;
 }

@@ -19,8 +19,7 @@ std::size_t SkipSection(const ChartLines& lines, std::size_t i, std::size_t last
     const bool wholeLine = opening == "BEGIN_DEVICE_CONTROL_SEQUENCE";
     for (std::size_t j = i + 1; j <= last; ++j) {
         const std::string_view line = lines.Line(j);
-        if (wholeLine ? line == closing
-                      : (!SplitTokens(line).empty() && SplitTokens(line).front().text == closing)) {
+        if (wholeLine ? line == closing : TokenAt(line, 0) == closing) {
             return j + 1;
         }
     }
@@ -40,12 +39,13 @@ TableText ReadTableText(const ChartLines& lines, std::size_t first, std::size_t 
     std::size_t i = first;
     while (i <= last && i < lines.Count()) {
         table.lastLine = i;
-        const auto tokens = SplitTokens(lines.Line(i));
-        if (tokens.empty()) {
+        const std::string_view line = lines.Line(i);
+        const std::string_view first = TokenAt(line, 0);
+        if (first.empty()) {
             ++i;
             continue;
         }
-        const std::string key(tokens.front().text);
+        const std::string key(first);
         if (IsSection(key)) {
             table.sections.push_back(i);
             i = SkipSection(lines, i, last, key);
@@ -76,11 +76,11 @@ TableText ReadTableText(const ChartLines& lines, std::size_t first, std::size_t 
             }
             for (++i; i <= last; ++i) {
                 table.lastLine = i;
-                const auto values = SplitTokens(lines.Line(i));
-                if (values.empty()) {
+                const std::string_view first = TokenAt(lines.Line(i), 0);
+                if (first.empty()) {
                     continue;
                 }
-                if (values.front().text == "END_DATA") {
+                if (first == "END_DATA") {
                     break;
                 }
                 if (firstBlock) {
@@ -96,8 +96,9 @@ TableText ReadTableText(const ChartLines& lines, std::size_t first, std::size_t 
             ++i;
             continue;
         }
-        const std::size_t keyEnd = tokens.front().offset + tokens.front().text.size();
-        table.header.push_back({i, key, Trim(lines.Line(i).substr(keyEnd))});
+        const std::size_t keyEnd =
+            static_cast<std::size_t>(first.data() - line.data()) + first.size();
+        table.header.push_back({i, key, Trim(line.substr(keyEnd))});
         ++i;
     }
     return table;
