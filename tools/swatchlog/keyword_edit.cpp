@@ -51,8 +51,8 @@ EditedText SetKeywords(const ChartLines& file, const TableExtent& table,
         if (index == insertAt) {
             result.text += text.substr(position, file.Begin(index) - position);
             position = file.Begin(index);
-            if (index > 0 && index == file.Count() && file.End(index - 1) == file.Begin(index) &&
-                !text.empty() && text.back() != '\n' && text.back() != '\r') {
+            if (index == file.Count() && !text.empty() && text.back() != '\n' &&
+                text.back() != '\r') {
                 result.text += end; // the identification line was the file's last, without an end
             }
             result.text += inserted;

@@ -138,15 +138,17 @@ std::string Quoted(std::string_view text) {
 
 bool NumericFieldRange(const std::string& field, double& low, double& high) {
     struct Range {
-        const char* prefix;
+        const char* field;
         double low;
         double high;
     };
     static const Range general[] = {
-        {"CMYK_", 0, 100}, {"ORANGE", 0, 100},        {"GREEN", 0, 100},    {"VIOLET", 0, 100},
-        {"RGB_", 0, 255},  {"LAB_L", 0, 100},         {"LAB_A", -200, 200}, {"LAB_B", -200, 200},
-        {"XYZ_", 0, 200},  {"D_RED", -1, 10},         {"D_GREEN", -1, 10},  {"D_BLUE", -1, 10},
-        {"D_VIS", -1, 10}, {"D_MAJOR_FILTER", -1, 10}};
+        {"CMYK_C", 0, 100},        {"CMYK_M", 0, 100},  {"CMYK_Y", 0, 100}, {"CMYK_K", 0, 100},
+        {"ORANGE", 0, 100},        {"GREEN", 0, 100},   {"VIOLET", 0, 100}, {"RGB_R", 0, 255},
+        {"RGB_G", 0, 255},         {"RGB_B", 0, 255},   {"LAB_L", 0, 100},  {"LAB_A", -200, 200},
+        {"LAB_B", -200, 200},      {"XYZ_X", 0, 200},   {"XYZ_Y", 0, 200},  {"XYZ_Z", 0, 200},
+        {"D_RED", -1, 10},         {"D_GREEN", -1, 10}, {"D_BLUE", -1, 10}, {"D_VIS", -1, 10},
+        {"D_MAJOR_FILTER", -1, 10}};
     if (IsSpectralField(field)) {
         low = -1;
         high = 200;
@@ -158,10 +160,7 @@ bool NumericFieldRange(const std::string& field, double& low, double& high) {
         return true;
     }
     for (const auto& range : general) {
-        const std::string prefix = range.prefix;
-        const bool isPrefix = prefix.back() == '_';
-        if (isPrefix ? field.rfind(prefix, 0) == 0 && field.size() == prefix.size() + 1
-                     : field == prefix) {
+        if (field == range.field) {
             low = range.low;
             high = range.high;
             return true;
