@@ -1,5 +1,9 @@
 #include "command_support.h"
 
+#include <memory>
+
+#include <redavudeva/redavudeva.h>
+
 #include "chart_model.h"
 #include "file_paths.h"
 #include "result_messages.h"
@@ -34,6 +38,19 @@ std::string RequireOutputPath(const ParsedArguments& parsed,
     return output;
 }
 
+int TableOption(const ParsedArguments& parsed, const std::string& name) {
+    if (!parsed.Has(name)) {
+        return 0;
+    }
+    const std::string value = parsed.Value(name);
+    if (value.empty() || value.size() > 6 ||
+        value.find_first_not_of("0123456789") != std::string::npos || std::stoi(value) < 1) {
+        throw UsageError("--" + name + " takes a table number from 1, not \"" + RepairUtf8(value) +
+                         "\"");
+    }
+    return std::stoi(value);
+}
+
 OutputFormat ParseFormat(const ParsedArguments& parsed, const std::vector<std::string>& allowed) {
     const std::string value = RequireChoice("format", parsed.Value("format", allowed[0]), allowed);
     OutputFormat format;
@@ -55,6 +72,22 @@ FailureText DefaultFailureText(const std::string& outputPath, const std::string&
     };
 }
 
+void RequirePatchCount(const std::wstring& libraryPath, std::size_t expected,
+                       const std::string& problem) {
+    std::unique_ptr<CSwatchlogBase> chart(
+        CSwatchlogFactory::GetReaderWriter(CSwatchlogFactory::READERWRITER_IT8));
+    const int code = chart ? chart->ReadChartFile(libraryPath) : -1;
+    if (code != 0) {
+        throw ChartError(problem + ": the written file does not read back (" +
+                         WithCode(DescribeReadResult(code), code) + "); nothing was written");
+    }
+    const auto count = static_cast<std::size_t>(chart->GetPatchCount());
+    if (count != expected) {
+        throw ChartError(problem + ": it reads back with " + std::to_string(count) +
+                         " patches, not " + std::to_string(expected) + "; nothing was written");
+    }
+}
+
 void WriteOutputFile(const std::string& outputPath, const FailureText& failure,
                      const WriteFunction& write) {
     LibraryPath(outputPath);
@@ -62,6 +95,8 @@ void WriteOutputFile(const std::string& outputPath, const FailureText& failure,
     int code = 0;
     try {
         code = write(LibraryPath(pending.TemporaryPath()));
+    } catch (const ChartError&) {
+        throw;
     } catch (const std::exception& error) {
         throw ChartError(RepairUtf8(outputPath) + ": " + DescribeLibraryException(error));
     }

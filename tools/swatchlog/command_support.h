@@ -18,6 +18,11 @@ void RequirePositionals(const ParsedArguments& parsed, std::size_t minimum, std:
 std::string RequireOutputPath(const ParsedArguments& parsed,
                               const std::vector<std::string>& inputs);
 
+/// The table number given by option `name` (1 for the first table), or 0
+/// (the first table with data) when it is absent; UsageError when it is not a
+/// whole number from 1.
+int TableOption(const ParsedArguments& parsed, const std::string& name = "table");
+
 /// Parses --format for commands with table, tsv, csv (as allowed) and json.
 struct OutputFormat {
     bool json = false;
@@ -33,9 +38,16 @@ using FailureText = std::function<std::string(int code)>;
 /// codes that blame the source file (21, 22) and `outputPath` for the others.
 FailureText DefaultFailureText(const std::string& outputPath, const std::string& sourcePath);
 
+/// Reads the written file at `libraryPath` back through the library and throws
+/// ChartError ("`problem`: it reads as N patches, not M") unless it reads with
+/// `expected` patches.
+void RequirePatchCount(const std::wstring& libraryPath, std::size_t expected,
+                       const std::string& problem);
+
 /// Writes `outputPath` whole or not at all: `write` gets a temporary path and
 /// answers the library's result code; a non-zero code, an exception or a
-/// failed rename throw ChartError and leave no trace of the output.
+/// failed rename throw ChartError and leave no trace of the output. A
+/// ChartError from `write` passes unchanged.
 void WriteOutputFile(const std::string& outputPath, const FailureText& failure,
                      const WriteFunction& write);
 
