@@ -80,7 +80,15 @@ public:
 
     /// Marks the spaces whose bit is clear as present and derives the missing ones
     /// it can (CMYK, XYZ, densities from the spectrum; Lab from XYZ; XYZ from Lab;
-    /// RGB from XYZ or CMYK).
+    /// RGB from XYZ or from CMYK the row supplied).
+    /// The spectrum reaches the colour engine as 10 nm values within 380..780 nm:
+    /// names 10 nm apart there pass unchanged; any other step, range or uneven
+    /// spacing is resampled (a cubic curve through the points, or a least-squares
+    /// fit where they are closer than 10 nm), and points outside 380..780 nm are
+    /// left out. A spectrum that cannot give colour (fewer than two values, a
+    /// non-finite value, two values at one wavelength, an unreadable field name,
+    /// nothing within 380..780 nm) derives nothing and raises no flag. CMYK derived
+    /// from an off-grid spectrum is the marker -1, 0, 0, 0 and never yields RGB.
     void SetMissingColorSpace(std::uint32_t mask);
     /// Sets the reference white used by later Lab and relative-XYZ computations.
     void SetNormLight(tagXYZ white);
@@ -102,8 +110,7 @@ public:
 
     /// Whether the patch's record lies on origin + t * direction within tolerance / 1e7.
     bool IsCMYKOnGradient(const tagCMYK& origin, const tagCMYK& direction, double tolerance);
-    bool IsCMYKOGOnGradient(const tagCMYKOG& origin, const tagCMYKOG& direction,
-                            double tolerance);
+    bool IsCMYKOGOnGradient(const tagCMYKOG& origin, const tagCMYKOG& direction, double tolerance);
     bool IsCMYKOGVOnGradient(const tagCMYKOGV& origin, const tagCMYKOGV& direction,
                              double tolerance);
     bool IsCMYKRGBOnGradient(const tagCMYKRGB& origin, const tagCMYKRGB& direction,

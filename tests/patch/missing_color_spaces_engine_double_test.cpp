@@ -1,6 +1,11 @@
 // The patch's colour-engine steps, watched and failed through the recording engine.
 #include <gtest/gtest.h>
 
+#include <limits>
+#include <map>
+#include <string>
+#include <vector>
+
 #include "patch_test_inputs.h"
 #include "recording_engine.h"
 
@@ -64,6 +69,93 @@ TEST_F(MissingColorSpacesEngine, EngineFailuresLeaveTheirSpaceMissingAndUnchange
     labOnly.spectral.clear();
     const CColorPatch noLabXyz = labOnly.Read(MISSING_XYZ);
     EXPECT_FALSE(noLabXyz.IsXYZPresent());
+}
+
+TEST_F(MissingColorSpacesEngine, OtherGridsAndRangesReachTheEngineAs10nmValues) {
+    struct Case {
+        std::map<std::string, double> spectrum; // value i is 0.5 + 0.01 i
+        int startNm;
+        int count;
+        std::size_t measured; // the engine's index of the point measured at 400 nm
+        std::size_t index;    // ... and its index in the measured spectrum
+    };
+    const Case cases[] = {
+        {patch_test::Spectrum("SPECTRAL_NM_", 380, 20, 21, 0.5, 0.01), 380, 41, 2, 1},
+        {patch_test::Spectrum("SPECTRAL_NM_", 360, 10, 43, 0.5, 0.01), 380, 41, 2, 4},
+        {patch_test::Spectrum("SPECTRAL_", 400, 10, 31, 0.5, 0.01), 400, 31, 0, 0},
+        {patch_test::Spectrum("SPECTRAL_NM_", 340, 20, 25, 0.5, 0.01), 380, 41, 2, 3}, // to 820
+    };
+    for (const Case& c : cases) {
+        engine_double::Reset();
+        patch_test::PatchInput in;
+        in.spectral = c.spectrum;
+        const CColorPatch p = in.Read(MISSING_XYZ | MISSING_LAB | MISSING_DENSITY);
+        const auto& calls = engine_double::Calls();
+        ASSERT_EQ(calls.size(), 2u);
+        EXPECT_EQ((std::vector<int>{calls[0].startNm, calls[0].count}),
+                  (std::vector<int>{c.startNm, c.count}));
+        EXPECT_EQ(calls[1].input, calls[0].input); // densities from the same 10 nm values
+        EXPECT_EQ(calls[0].input.at(c.measured), static_cast<float>(0.5 + 0.01 * c.index));
+        EXPECT_TRUE(p.IsXYZPresent() && p.IsLABPresent() && p.IsDensityAvailable());
+    }
+}
+
+TEST_F(MissingColorSpacesEngine, SpectraThatCannotGiveColourDeriveNothing) {
+    auto withNan = patch_test::Spectrum("SPECTRAL_NM_", 380, 10, 36, 0.5);
+    withNan["SPECTRAL_NM_500"] = std::numeric_limits<double>::quiet_NaN();
+    auto unreadable = patch_test::Spectrum("", 380, 10, 36, 0.5); // "380" ... "730"
+    std::map<std::string, double> trailer;
+    for (const auto& [name, value] : unreadable) {
+        trailer[name + "NM"] = value; // "380NM" ... "730NM"
+    }
+    trailer["5XYZ"] = 0.5; // between them, but names no wavelength
+    const std::map<std::string, double> cases[] = {
+        {{"SPECTRAL_NM_550", 0.5}},                              // one value
+        withNan,                                                 // not a number
+        patch_test::Spectrum("SPECTRAL_NM_", 300, 10, 8, 0.5),   // 300..370 nm
+        patch_test::Spectrum("SPECTRAL_NM_", 380, 10, 36, 1e39), // no float holds it
+        trailer,
+    };
+    for (const auto& spectrum : cases) {
+        engine_double::Reset();
+        patch_test::PatchInput in;
+        in.spectral = spectrum;
+        const CColorPatch p = in.Read(patch_test::SuppliedOnly(0));
+        EXPECT_TRUE(engine_double::Calls().empty());
+        EXPECT_EQ(patch_test::FlagCount(p), 1) << "only the spectrum itself is present";
+        EXPECT_EQ(p.GetXYZ().y, 0.0);
+    }
+}
+
+TEST_F(MissingColorSpacesEngine, OnlySuppliedCmykGivesRgbWhenXyzFails) {
+    // CMYK derived from a spectrum holds densities, or off the 380..730 nm / 10 nm
+    // grid the marker (-1, 0, 0, 0), which as tone values would read as RGB
+    // (257, 255, 255). Neither is a device value. CMYK (50, 0, 0, 0) from the row
+    // gives (1 - 0.5) * 255 = 127.5, truncated to 127.
+    engine_double::FailAll(Call::SpectralToXYZ);
+    struct Case {
+        std::map<std::string, double> spectrum;
+        double c; // the derived record's first value
+    };
+    const Case cases[] = {
+        {patch_test::Spectrum("SPECTRAL_NM_", 380, 20, 21, 0.5), -1.0},     // the marker
+        {patch_test::Spectrum("SPECTRAL_NM_", 380, 10, 36, 0.5), 0.30103}}; // -log10(0.5)
+    for (const Case& c : cases) {
+        patch_test::PatchInput in;
+        in.spectral = c.spectrum;
+        const CColorPatch p = in.Read(patch_test::SuppliedOnly(0));
+        EXPECT_TRUE(p.IsCMYKPresent());
+        EXPECT_NEAR(p.GetCMYK().c, c.c, 1e-5);
+        EXPECT_FALSE(p.IsRGBPresent());
+    }
+
+    patch_test::PatchInput supplied;
+    supplied.cmyk = {50, 0, 0, 0};
+    supplied.spectral = patch_test::Spectrum("SPECTRAL_NM_", 380, 20, 21, 0.5);
+    const CColorPatch p = supplied.Read(patch_test::SuppliedOnly(MISSING_CMYK));
+    ASSERT_TRUE(p.IsRGBPresent());
+    EXPECT_EQ((std::vector<int>{p.GetRGB().r, p.GetRGB().g, p.GetRGB().b}),
+              (std::vector<int>{127, 255, 255}));
 }
 
 } // namespace
