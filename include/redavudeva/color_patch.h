@@ -149,6 +149,11 @@ private:
     bool m_bHTMLCOLOR = false;
     bool m_bNColor = false;
     bool m_bDensity = false;
+    /// The spectral names lie 10 nm apart within 380..780 nm and every value fits a
+    /// float: m_spectral reaches the colour engine as it is. Set with m_spectral;
+    /// it sits in what was padding before m_missingMask, so the object's size and
+    /// the other members' places are as before.
+    bool m_bSpectralOnEngineGrid = false;
     std::uint32_t m_missingMask = 0;
     double m_normWeighting[4] = {};
     std::string m_label;

@@ -7,6 +7,7 @@
 #include <limits>
 #include <map>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "redavudeva/records.h"
@@ -53,11 +54,54 @@ struct EngineSpectrum {
 /// wavelength, or none within 380..780 nm.
 bool Resample(std::vector<Sample> samples, EngineSpectrum& out);
 
-/// The same for a patch's spectral map, whose names give the wavelengths as the
-/// patch reads them (marker chosen from the greatest name). Names 10 nm apart
-/// within 380..780 nm pass their values unchanged; a name whose wavelength
-/// cannot be read makes the spectrum unusable (false).
-bool FromPatchSpectrum(const std::map<std::string, double>& spectral, EngineSpectrum& out);
+/// Follows a patch's spectral names and values in name order, as the patch lays
+/// them out on its grid, to tell whether they can reach the engine as they are:
+/// names 10 nm apart within 380..780 nm, values a float holds. Cheap enough to
+/// run on every name of every patch; only the first and last name are read as
+/// numbers (see OnEngineGrid).
+class NameWatch {
+public:
+    void See(const std::string& name, double value) {
+        if (seen_++ == 0) {
+            First(name);
+        } else if (!alike_ || name.size() != size_ || name.back() != lastChar_) {
+            alike_ = false;
+            return;
+        } else {
+            for (std::size_t i = digitsFrom_; i + 1 < size_; ++i) {
+                if (name[i] < '0' || name[i] > '9') {
+                    alike_ = false;
+                    return;
+                }
+            }
+        }
+        alike_ = alike_ && IsUsableValue(value);
+    }
+
+    /// Whether the names seen, `first` and `last` among them, are the marker
+    /// followed by the digits of wavelengths 10 nm apart within 380..780 nm.
+    bool OnEngineGrid(const std::string& first, const std::string& last,
+                      std::string_view marker) const;
+
+private:
+    // The first name sets what every other one must look like: its length, its
+    // last character and where its trailing digits begin.
+    void First(const std::string& name);
+
+    std::size_t seen_ = 0;
+    std::size_t size_ = 0;
+    std::size_t digitsFrom_ = 0;
+    char lastChar_ = '\0';
+    bool alike_ = true;
+};
+
+/// A patch's spectrum for the engine. `onEngineGrid` (from NameWatch) lets the
+/// grid's values pass unchanged; otherwise every name is read (marker chosen
+/// from the greatest name, as the patch reads its grid) and the points are
+/// resampled. A name whose wavelength cannot be read makes the spectrum
+/// unusable (false).
+bool FromPatchSpectrum(const std::map<std::string, double>& spectral,
+                       const SpectralDataStruct& grid, bool onEngineGrid, EngineSpectrum& out);
 
 /// X, Y, Z (white Y = 100) through the colour engine; `xyz` changes only on success.
 bool ToXYZ(const EngineSpectrum& spectrum, tagXYZ& xyz);

@@ -27,9 +27,10 @@ void CColorPatch::SetMissingColorSpace(std::uint32_t mask) {
     // non-finite value, nothing within 380..780 nm, an unreadable name) derives
     // nothing at all.
     engine_spectrum::EngineSpectrum spectrum;
-    const bool spectrumUsable = m_bSpectral &&
-                                (mask & (MISSING_CMYK | MISSING_XYZ | MISSING_DENSITY)) != 0 &&
-                                engine_spectrum::FromPatchSpectrum(m_spectralData, spectrum);
+    const bool spectrumUsable =
+        m_bSpectral && (mask & (MISSING_CMYK | MISSING_XYZ | MISSING_DENSITY)) != 0 &&
+        engine_spectrum::FromPatchSpectrum(m_spectralData, m_spectral, m_bSpectralOnEngineGrid,
+                                           spectrum);
 
     // CMYK (holding red, green, blue and visual density) from the spectrum; an
     // off-grid spectrum still counts, its record then reads -1, 0, 0, 0.

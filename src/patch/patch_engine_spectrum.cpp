@@ -1,7 +1,5 @@
 // A patch's spectral map as the colour engine takes it.
-#include <cmath>
 #include <cstddef>
-#include <cstdint>
 #include <utility>
 
 #include "patch/engine_spectrum.h"
@@ -9,10 +7,6 @@
 
 namespace engine_spectrum {
 namespace {
-
-bool StartsWith(const std::string& name, std::string_view marker) {
-    return name.compare(0, marker.size(), marker) == 0;
-}
 
 // The wavelength spelt by the digits after a leading marker of `markerSize`
 // characters; -1 unless they are 1 to 9 decimal digits and nothing else.
@@ -32,63 +26,52 @@ int DigitsAfter(const std::string& name, std::size_t markerSize) {
     return nm;
 }
 
-// The usual spectrum: names that start with the marker and end in the digits
-// of wavelengths 10 nm apart within 380..780 nm, with finite values. Its values
-// go to the engine unchanged. Any other spectrum answers false and goes the
-// long way, which reads every name in full.
-//
+} // namespace
+
+void NameWatch::First(const std::string& name) {
+    size_ = name.size();
+    lastChar_ = name.empty() ? '\0' : name.back();
+    digitsFrom_ = size_;
+    while (digitsFrom_ > 0 && name[digitsFrom_ - 1] >= '0' && name[digitsFrom_ - 1] <= '9') {
+        --digitsFrom_;
+    }
+}
+
 // Only the first and the last name are read as numbers. The names lie in byte
 // order, so when both start with the marker every name between them does; when
-// every name is the marker followed by as many digits as the first, byte order
-// is numeric order, and when each ends in the first one's last digit, the n
-// distinct wavelengths from start to start + 10 (n - 1) can only be those
-// 10 nm apart.
-bool TakeAsItIs(const std::map<std::string, double>& spectral, std::string_view marker,
-                EngineSpectrum& out) {
-    const auto count = static_cast<int>(spectral.size());
-    const std::string& first = spectral.begin()->first;
-    const std::string& last = spectral.rbegin()->first;
-    if (count > kMaxCount || !StartsWith(first, marker) || !StartsWith(last, marker) ||
-        last.size() != first.size()) {
+// every name is as long as the first, holds digits wherever the first does after
+// the marker, and ends in the first one's last digit, byte order is numeric
+// order and all wavelengths share their last digit, so n distinct ones from
+// start to start + 10 (n - 1) can only be those 10 nm apart.
+bool NameWatch::OnEngineGrid(const std::string& first, const std::string& last,
+                             std::string_view marker) const {
+    const auto count = static_cast<int>(seen_);
+    if (!alike_ || count < 2 || count > kMaxCount || digitsFrom_ > marker.size() ||
+        size_ <= marker.size() || first.compare(0, marker.size(), marker) != 0 ||
+        last.compare(0, marker.size(), marker) != 0) {
         return false;
     }
     const int startNm = DigitsAfter(first, marker.size());
-    if (startNm < kLowestNm || startNm > kHighestNm - kStepNm * (count - 1) ||
-        DigitsAfter(last, marker.size()) != startNm + kStepNm * (count - 1)) {
-        return false;
-    }
-    const std::size_t size = first.size();
-    const char lastDigit = first.back();
-    std::size_t i = 0;
-    for (const auto& [name, value] : spectral) {
-        if (name.size() != size || name.back() != lastDigit || !IsUsableValue(value)) {
-            return false;
-        }
-        const char* const end = name.data() + size - 1;
-        for (const char* c = name.data() + marker.size(); c < end; ++c) {
-            if (static_cast<unsigned char>(*c - '0') > 9) {
-                return false;
-            }
-        }
-        out.values[i++] = static_cast<float>(value);
-    }
-    out.startNm = startNm;
-    out.count = count;
-    return true;
+    return startNm >= kLowestNm && startNm <= kHighestNm - kStepNm * (count - 1) &&
+           DigitsAfter(last, marker.size()) == startNm + kStepNm * (count - 1);
 }
 
-} // namespace
-
-bool FromPatchSpectrum(const std::map<std::string, double>& spectral, EngineSpectrum& out) {
+bool FromPatchSpectrum(const std::map<std::string, double>& spectral,
+                       const SpectralDataStruct& grid, bool onEngineGrid, EngineSpectrum& out) {
+    if (onEngineGrid) {
+        out.startNm = grid.startNm;
+        out.count = grid.count;
+        for (std::size_t i = 0; i < static_cast<std::size_t>(grid.count); ++i) {
+            out.values[i] = static_cast<float>(grid.values[i]);
+        }
+        return true;
+    }
     if (spectral.size() < 2) {
         return false;
     }
     const char* marker = field_wavelength::MarkerIn(spectral.rbegin()->first);
     if (marker == nullptr) {
         return false;
-    }
-    if (TakeAsItIs(spectral, marker, out)) {
-        return true;
     }
     std::vector<Sample> samples;
     samples.reserve(spectral.size());

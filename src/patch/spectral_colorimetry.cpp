@@ -62,13 +62,15 @@ void CColorPatch::computeNormWeighting() {
 // one that cannot give colour derives nothing.
 bool CColorPatch::calculateXYZ() {
     engine_spectrum::EngineSpectrum spectrum;
-    return engine_spectrum::FromPatchSpectrum(m_spectralData, spectrum) &&
+    return engine_spectrum::FromPatchSpectrum(m_spectralData, m_spectral, m_bSpectralOnEngineGrid,
+                                              spectrum) &&
            engine_spectrum::ToXYZ(spectrum, m_XYZ);
 }
 
 bool CColorPatch::calculateDensities() {
     engine_spectrum::EngineSpectrum spectrum;
-    return engine_spectrum::FromPatchSpectrum(m_spectralData, spectrum) &&
+    return engine_spectrum::FromPatchSpectrum(m_spectralData, m_spectral, m_bSpectralOnEngineGrid,
+                                              spectrum) &&
            engine_spectrum::ToDensities(spectrum, m_density);
 }
 

@@ -6,6 +6,7 @@
 #include <string>
 #include <string_view>
 
+#include "patch/engine_spectrum.h"
 #include "patch/field_wavelength.h"
 #include "patch/text_number.h"
 #include "redavudeva/color_patch.h"
@@ -69,12 +70,15 @@ void CColorPatch::SetSpectralDataStruct() {
     SpectralDataStruct grid;
     const std::string* leastKey = nullptr;
     const std::string* greatestKey = nullptr;
+    engine_spectrum::NameWatch
+        names; // in the same walk: can the values go to the engine as they are?
     for (const auto& entry : m_spectralData) {
         if (static_cast<std::size_t>(grid.count) == kGridCapacity) {
             break;
         }
         grid.values[grid.count] = entry.second;
         ++grid.count;
+        names.See(entry.first, entry.second);
         if (leastKey == nullptr) {
             leastKey = &entry.first;
         }
@@ -89,4 +93,6 @@ void CColorPatch::SetSpectralDataStruct() {
 
     m_spectral = grid;
     m_bSpectral = true;
+    m_bSpectralOnEngineGrid = static_cast<std::size_t>(grid.count) == m_spectralData.size() &&
+                              names.OnEngineGrid(*leastKey, *greatestKey, marker);
 }

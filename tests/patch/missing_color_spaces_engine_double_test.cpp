@@ -100,6 +100,26 @@ TEST_F(MissingColorSpacesEngine, OtherGridsAndRangesReachTheEngineAs10nmValues) 
     }
 }
 
+TEST_F(MissingColorSpacesEngine, UnevenNamesAreResampledThoughTheEndsAndCountLookEven) {
+    // 36 names from 380 to 730 nm, but 395 nm in place of 400 nm; the values rise
+    // by 0.001 per nm. The curve through the points is exact for a straight line
+    // away from the ends, so the engine's 400 nm value is 0.52, not the 0.515
+    // measured at 395 nm.
+    std::map<std::string, double> spectrum;
+    for (int i = 0; i < 36; ++i) {
+        const int nm = i == 2 ? 395 : 380 + 10 * i;
+        spectrum["SPECTRAL_NM_" + std::to_string(nm)] = 0.5 + 0.001 * (nm - 380);
+    }
+    patch_test::PatchInput in;
+    in.spectral = spectrum;
+    in.Read(MISSING_XYZ);
+    const auto& calls = engine_double::Calls();
+    ASSERT_EQ(calls.size(), 1u);
+    EXPECT_EQ((std::vector<int>{calls[0].startNm, calls[0].count}), (std::vector<int>{380, 36}));
+    EXPECT_EQ(calls[0].input.at(1), 0.51f);
+    EXPECT_FLOAT_EQ(calls[0].input.at(2), 0.52f);
+}
+
 TEST_F(MissingColorSpacesEngine, SpectraThatCannotGiveColourDeriveNothing) {
     auto withNan = patch_test::Spectrum("SPECTRAL_NM_", 380, 10, 36, 0.5);
     withNan["SPECTRAL_NM_500"] = std::numeric_limits<double>::quiet_NaN();
