@@ -70,8 +70,8 @@ void CColorPatch::SetSpectralDataStruct() {
     SpectralDataStruct grid;
     const std::string* leastKey = nullptr;
     const std::string* greatestKey = nullptr;
-    engine_spectrum::NameWatch
-        names; // in the same walk: can the values go to the engine as they are?
+    // In the same walk: can the values go to the engine as they are?
+    engine_spectrum::NameWatch names;
     for (const auto& entry : m_spectralData) {
         if (static_cast<std::size_t>(grid.count) == kGridCapacity) {
             break;
