@@ -54,52 +54,65 @@ struct EngineSpectrum {
 /// wavelength, or none within 380..780 nm.
 bool Resample(std::vector<Sample> samples, EngineSpectrum& out);
 
-/// Follows a patch's spectral names and values in name order, as the patch lays
-/// them out on its grid, to tell whether they can reach the engine as they are:
+/// Whether names `first` .. `last` in byte order, `count` of them, each as long
+/// as `first` and holding digits where it does after `marker`, and all ending in
+/// its last character, name wavelengths 10 nm apart within 380..780 nm.
+bool NamesOnEngineGrid(const std::string& first, const std::string& last, std::string_view marker,
+                       int count);
+
+/// Follows a patch's spectral names in name order, as the patch lays them out
+/// on its grid, to tell whether its values can reach the engine as they are:
 /// names 10 nm apart within 380..780 nm, values a float holds. Cheap enough to
 /// run on every name of every patch; only the first and last name are read as
-/// numbers (see OnEngineGrid).
+/// numbers (see NamesOnEngineGrid).
 class NameWatch {
 public:
-    void See(const std::string& name, double value) {
-        if (seen_++ == 0) {
-            First(name);
-        } else if (!alike_ || name.size() != size_ || name.back() != lastChar_) {
-            alike_ = false;
-            return;
-        } else {
-            for (std::size_t i = digitsFrom_; i + 1 < size_; ++i) {
-                if (name[i] < '0' || name[i] > '9') {
-                    alike_ = false;
-                    return;
-                }
-            }
+    /// Every name must look like `first`: as long, ending in the same character,
+    /// with digits wherever `first` has its trailing digits.
+    explicit NameWatch(const std::string& first)
+        : size_(first.size()), digitsFrom_(first.size()),
+          lastChar_(first.empty() ? '\0' : first.back()) {
+        while (digitsFrom_ > 0 && first[digitsFrom_ - 1] >= '0' && first[digitsFrom_ - 1] <= '9') {
+            --digitsFrom_;
         }
-        alike_ = alike_ && IsUsableValue(value);
     }
 
-    /// Whether the names seen, `first` and `last` among them, are the marker
-    /// followed by the digits of wavelengths 10 nm apart within 380..780 nm.
-    bool OnEngineGrid(const std::string& first, const std::string& last,
-                      std::string_view marker) const;
+    void See(const std::string& name) {
+        if (!alike_) {
+            return;
+        }
+        alike_ = name.size() == size_ && name.back() == lastChar_;
+        for (std::size_t i = digitsFrom_; alike_ && i + 1 < size_; ++i) {
+            alike_ = name[i] >= '0' && name[i] <= '9';
+        }
+    }
+
+    /// Whether the `count` names seen, from `first` to `last`, and their values
+    /// can go to the engine as they are.
+    bool OnEngineGrid(const std::string& first, const std::string& last, std::string_view marker,
+                      const double* values, int count) const {
+        if (!alike_ || digitsFrom_ > marker.size()) {
+            return false;
+        }
+        for (int i = 0; i < count; ++i) {
+            if (!IsUsableValue(values[i])) {
+                return false;
+            }
+        }
+        return NamesOnEngineGrid(first, last, marker, count);
+    }
 
 private:
-    // The first name sets what every other one must look like: its length, its
-    // last character and where its trailing digits begin.
-    void First(const std::string& name);
-
-    std::size_t seen_ = 0;
-    std::size_t size_ = 0;
-    std::size_t digitsFrom_ = 0;
-    char lastChar_ = '\0';
+    std::size_t size_;
+    std::size_t digitsFrom_;
+    char lastChar_;
     bool alike_ = true;
 };
 
 /// A patch's spectrum for the engine. `onEngineGrid` (from NameWatch) lets the
-/// grid's values pass unchanged; otherwise every name is read (marker chosen
-/// from the greatest name, as the patch reads its grid) and the points are
-/// resampled. A name whose wavelength cannot be read makes the spectrum
-/// unusable (false).
+/// grid's values pass unchanged; otherwise every name is read (marker
+/// chosen from the greatest name, as the patch reads its grid) and the points are resampled. A name
+/// whose wavelength cannot be read makes the spectrum unusable (false).
 bool FromPatchSpectrum(const std::map<std::string, double>& spectral,
                        const SpectralDataStruct& grid, bool onEngineGrid, EngineSpectrum& out);
 

@@ -28,26 +28,15 @@ int DigitsAfter(const std::string& name, std::size_t markerSize) {
 
 } // namespace
 
-void NameWatch::First(const std::string& name) {
-    size_ = name.size();
-    lastChar_ = name.empty() ? '\0' : name.back();
-    digitsFrom_ = size_;
-    while (digitsFrom_ > 0 && name[digitsFrom_ - 1] >= '0' && name[digitsFrom_ - 1] <= '9') {
-        --digitsFrom_;
-    }
-}
-
 // Only the first and the last name are read as numbers. The names lie in byte
 // order, so when both start with the marker every name between them does; when
 // every name is as long as the first, holds digits wherever the first does after
 // the marker, and ends in the first one's last digit, byte order is numeric
-// order and all wavelengths share their last digit, so n distinct ones from
-// start to start + 10 (n - 1) can only be those 10 nm apart.
-bool NameWatch::OnEngineGrid(const std::string& first, const std::string& last,
-                             std::string_view marker) const {
-    const auto count = static_cast<int>(seen_);
-    if (!alike_ || count < 2 || count > kMaxCount || digitsFrom_ > marker.size() ||
-        size_ <= marker.size() || first.compare(0, marker.size(), marker) != 0 ||
+// order and all wavelengths share their last digit, so `count` distinct ones
+// from start to start + 10 (count - 1) can only be those 10 nm apart.
+bool NamesOnEngineGrid(const std::string& first, const std::string& last, std::string_view marker,
+                       int count) {
+    if (count < 2 || count > kMaxCount || first.compare(0, marker.size(), marker) != 0 ||
         last.compare(0, marker.size(), marker) != 0) {
         return false;
     }

@@ -71,14 +71,14 @@ void CColorPatch::SetSpectralDataStruct() {
     const std::string* leastKey = nullptr;
     const std::string* greatestKey = nullptr;
     // In the same walk: can the values go to the engine as they are?
-    engine_spectrum::NameWatch names;
+    engine_spectrum::NameWatch names(m_spectralData.begin()->first);
     for (const auto& entry : m_spectralData) {
         if (static_cast<std::size_t>(grid.count) == kGridCapacity) {
             break;
         }
         grid.values[grid.count] = entry.second;
         ++grid.count;
-        names.See(entry.first, entry.second);
+        names.See(entry.first);
         if (leastKey == nullptr) {
             leastKey = &entry.first;
         }
@@ -93,6 +93,7 @@ void CColorPatch::SetSpectralDataStruct() {
 
     m_spectral = grid;
     m_bSpectral = true;
-    m_bSpectralOnEngineGrid = static_cast<std::size_t>(grid.count) == m_spectralData.size() &&
-                              names.OnEngineGrid(*leastKey, *greatestKey, marker);
+    m_bSpectralOnEngineGrid =
+        static_cast<std::size_t>(grid.count) == m_spectralData.size() &&
+        names.OnEngineGrid(*leastKey, *greatestKey, marker, grid.values, grid.count);
 }
