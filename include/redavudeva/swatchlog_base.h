@@ -129,7 +129,11 @@ public:
     virtual int FindClosestPatch(const tagCMYKOG& target);
     virtual int FindClosestPatch(const tagCMYKRGB& target, double maximumDistance);
     virtual int FindClosestPatch(const tagCMYKRGB& target);
-    /// Record of one patch: 0, 11 (no patches), 12 (space not carried), 10 (no such sample).
+    /// Record of one patch: 0, 11 (no patches), 12 (space not carried by the chart),
+    /// 10 (no such sample), 12 (that patch does not hold the space, e.g. its spectrum
+    /// gave no colour: one value, a non-finite value, nothing within 380..780 nm).
+    /// Changed: the per-patch 12 is new; these queries used to answer 0 with the
+    /// patch's unset (zero) record.
     virtual int GetPatchCMYK(int sampleNumber, tagCMYK& cmyk);
     virtual int GetPatchCMYKOG(int sampleNumber, tagCMYKOG& cmykog);
     virtual int GetPatchCMYKRGB(int sampleNumber, tagCMYKRGB& cmykrgb);
@@ -137,7 +141,9 @@ public:
     virtual int GetPatchLAB(int sampleNumber, tagLAB& lab);
     virtual int GetPatchRGB(int sampleNumber, tagRGB& rgb);
     virtual int GetPatchDensity(int sampleNumber, tagDENSITY& density);
-    /// Every patch's record in sample order: 0, 11 (no patches), 12 (space not carried).
+    /// Every patch's record in sample order: 0, 11 (no patches), 12 (space not carried
+    /// by the chart, or not held by one of its patches; the list is then untouched).
+    /// Changed: a patch that lacks the space used to contribute a zero record.
     virtual int CollectCMYK(std::vector<tagCMYK>& list);
     virtual int CollectCMYKOG(std::vector<tagCMYKOG>& list);
     virtual int CollectCMYKO(std::vector<SWL_CMYKO>& list);
@@ -147,17 +153,18 @@ public:
     virtual int CollectLAB(std::vector<tagLAB>& list);
     virtual int CollectRGB(std::vector<tagRGB>& list);
     virtual int CollectHTMLCOLOR(std::vector<tagHTMLCOLOR>& list);
-    /// Every patch's n-colour map: 0 or 12.
+    /// Every patch's n-colour map: 0 or 12 (not carried, or a patch without channels).
     virtual int CollectNColorMaps(std::vector<std::map<int, tagNCLR>>& list);
     /// Device values of every patch as lists of numbers: 0, 12; base version 24.
     virtual int GetDeviceValueLists(std::vector<std::vector<double>>& lists);
-    /// Every patch's densities in sample order: 0, 11, 12.
+    /// Every patch's densities in sample order: 0, 11, 12 (as for the records above).
     virtual int CollectDensities(std::vector<tagDENSITY>& list);
     /// Sets the strip layout: 0, or 15 for a count below 1.
     virtual int SetLayout(int strips, int columns);
     /// Sets the page count: 0, or 18 for a count below 1.
     virtual int SetNumberOfPages(int pages);
-    /// Records of one strip (1-based): 0, 12, 15, 16, 17.
+    /// Records of one strip (1-based): 0, 12, 15, 16, 17; also 12 (new) when a patch
+    /// of that strip does not hold the space.
     virtual int CollectStripRGB(int strip, std::vector<tagRGB>& list);
     virtual int CollectStripLAB(int strip, std::vector<tagLAB>& list);
     virtual int CollectStripXYZ(int strip, std::vector<tagXYZ>& list);
@@ -216,7 +223,12 @@ public:
     virtual void SetXYZList(const std::vector<tagXYZ>& list);
     virtual void SetLABList(const std::vector<tagLAB>& list);
     virtual void SetRGBList(const std::vector<tagRGB>& list);
-    /// Sets the spectra to be written; with `compute` also XYZ, Lab and densities.
+    /// Sets the spectra to be written; with `compute` also XYZ, Lab and densities, one
+    /// entry each per spectrum that gives colour. Each spectrum is read on the
+    /// wavelengths of its own field names; any step or range is brought onto 10 nm
+    /// steps within 380..780 nm first (see CColorPatch::SetMissingColorSpace). A
+    /// spectrum with an unreadable name, one value, a non-finite value or nothing
+    /// within 380..780 nm is skipped.
     virtual void SetSpectralDataList(const std::vector<std::map<std::string, double>>& list,
                                      bool compute);
     virtual void SetNColorList(const std::vector<std::map<int, tagNCLR>>& list);

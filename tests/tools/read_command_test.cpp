@@ -100,6 +100,30 @@ TEST_F(ToolTest, EveryTableOfAFileOfSeveralIsReadable) {
     }
 }
 
+TEST_F(ToolTest, PatchesLeaveValuesAPatchCouldNotDeriveEmpty) {
+    // Spectra every 20 nm from 380 to 780 nm: a flat 0.5, one with "nan" at 500 nm
+    // and one with a value no float holds. Only the first gives colour: Y = 50
+    // (half the white's 100), L* = 116 * 0.5^(1/3) - 16 = 76.07.
+    std::string text = "CGATS.17\nNUMBER_OF_FIELDS 23\nBEGIN_DATA_FORMAT\nSAMPLE_ID SAMPLE_NAME";
+    std::string rows[3] = {"1 flat", "2 nan", "3 huge"};
+    for (int nm = 380; nm <= 780; nm += 20) {
+        text += " SPECTRAL_NM_" + std::to_string(nm);
+        rows[0] += " 0.5";
+        rows[1] += nm == 500 ? " nan" : " 0.5";
+        rows[2] += nm == 500 ? " 1e39" : " 0.5";
+    }
+    text += "\nEND_DATA_FORMAT\nNUMBER_OF_SETS 3\nBEGIN_DATA\n" + rows[0] + "\n" + rows[1] + "\n" +
+            rows[2] + "\nEND_DATA\n";
+    dir.write("spectra.it8", text);
+    const std::string empty13(13, '\t');
+    ExpectIn(Tsv("spectra.it8", "rgb,xyz,lab,density"),
+             {"\t50.00\t", "\t76.07\t", "\n2\tnan" + empty13 + "\n", "\n3\thuge" + empty13 + "\n"});
+    REQUIRE_JQ();
+    ExpectJson(Ok({"patches", "spectra.it8", "--spaces", "rgb,lab", "--format", "json"}),
+               {"[.patches[] | .lab != null] == [true, false, false]",
+                "[.patches[] | .rgb != null] == [true, false, false]"});
+}
+
 TEST_F(ToolTest, ValidateSaysWhatIsWrongWithLineNumbers) {
     dir.write("good.it8", LabChart(kRows));
     std::vector<std::string> wide = kRows;
