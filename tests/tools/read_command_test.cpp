@@ -117,7 +117,8 @@ TEST_F(ToolTest, PatchesLeaveValuesAPatchCouldNotDeriveEmpty) {
     dir.write("spectra.it8", text);
     const std::string empty13(13, '\t');
     ExpectIn(Tsv("spectra.it8", "rgb,xyz,lab,density"),
-             {"\t50.00\t", "\t76.07\t", "\n2\tnan" + empty13 + "\n", "\n3\thuge" + empty13 + "\n"});
+             {"\t50.00\t", "\t76.07\t", "\n2\t2\tnan" + empty13 + "\n",
+              "\n3\t3\thuge" + empty13 + "\n"});
     REQUIRE_JQ();
     ExpectJson(Ok({"patches", "spectra.it8", "--spaces", "rgb,lab", "--format", "json"}),
                {"[.patches[] | .lab != null] == [true, false, false]",
