@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <array>
 #include <fstream>
-#include <iterator>
 
 #include "chart_model.h"
 #include "command_support.h"
@@ -220,8 +219,11 @@ void HandListsToStore(const Chart& chart, const KeywordList& keywords,
 }
 
 std::string ReadText(const std::string& utf8Path) {
-    std::ifstream in(FileSystemPath(utf8Path), std::ios::binary);
-    return std::string((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
+    std::string text;
+    if (!ReadRegularFile(utf8Path, text)) {
+        throw ChartError(RepairUtf8(utf8Path) + ": the file cannot be read");
+    }
+    return text;
 }
 
 // The new-file writer numbers the rows; put the file's own SAMPLE_ID back at
