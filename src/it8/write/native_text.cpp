@@ -19,7 +19,7 @@ constexpr std::size_t kPieceSize = 64 * 1024;
 
 class PieceBuffer {
 public:
-    explicit PieceBuffer(const TextSink& sink) : sink_(sink) { piece_.reserve(kPieceSize); }
+    explicit PieceBuffer(const files::PieceSink& sink) : sink_(sink) { piece_.reserve(kPieceSize); }
 
     bool Append(const char* data, std::size_t size) {
         while (size > 0) {
@@ -41,7 +41,7 @@ public:
     }
 
 private:
-    const TextSink& sink_;
+    const files::PieceSink& sink_;
     std::string piece_;
 };
 
@@ -56,7 +56,7 @@ std::uint64_t NativeTextSize(const std::vector<std::string>& lines) {
     return size;
 }
 
-bool ForEachTextPiece(const std::vector<std::string>& lines, const TextSink& sink) {
+bool ForEachTextPiece(const std::vector<std::string>& lines, const files::PieceSink& sink) {
     PieceBuffer buffer(sink);
     for (const std::string& line : lines) {
         // The line's own LFs, if any, are line ends as well.
@@ -77,6 +77,11 @@ bool ForEachTextPiece(const std::vector<std::string>& lines, const TextSink& sin
         }
     }
     return buffer.Flush();
+}
+
+files::Content NativeTextContent(const std::vector<std::string>& lines) {
+    return {NativeTextSize(lines),
+            [&lines](const files::PieceSink& sink) { return ForEachTextPiece(lines, sink); }};
 }
 
 } // namespace it8

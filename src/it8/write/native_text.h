@@ -1,16 +1,13 @@
 // The bytes of a finished chart text as they go to disk.
 #pragma once
 
-#include <cstddef>
 #include <cstdint>
-#include <functional>
 #include <string>
 #include <vector>
 
-namespace it8 {
+#include "it8/files/content.h"
 
-/// Receives consecutive pieces of the text; answers false to stop.
-using TextSink = std::function<bool(const char* data, std::size_t size)>;
+namespace it8 {
 
 /// The number of bytes that ForEachTextPiece hands out for `lines`.
 std::uint64_t NativeTextSize(const std::vector<std::string>& lines);
@@ -19,6 +16,9 @@ std::uint64_t NativeTextSize(const std::vector<std::string>& lines);
 /// where every LF, also one inside a line, becomes the platform's text-file
 /// line end (CR LF on Windows, LF elsewhere), as a text-mode stream writes it.
 /// False when the sink stopped.
-bool ForEachTextPiece(const std::vector<std::string>& lines, const TextSink& sink);
+bool ForEachTextPiece(const std::vector<std::string>& lines, const files::PieceSink& sink);
+
+/// The text as a content for a file; `lines` must outlive it.
+files::Content NativeTextContent(const std::vector<std::string>& lines);
 
 } // namespace it8
