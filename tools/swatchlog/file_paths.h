@@ -23,23 +23,27 @@ bool SameFile(const std::string& first, const std::string& second);
 
 /// An output file written first under a temporary name and put in place by
 /// Commit(), so that a failure leaves no output file and an existing one
-/// untouched. The temporary file is removed unless committed.
+/// untouched. The temporary file is removed when the object goes.
 ///
 /// An existing output is opened for writing (not truncated) when the object is
 /// made: one the user may not write, a folder or a loop of symbolic links is
 /// refused there with ChartError (the file and the reason) before any work is
 /// done. A symbolic link is followed to the file it names. The temporary file is
-/// made at once, empty, with no more permissions than the output it replaces
-/// (a new output gets the usual mode for a new file).
+/// made at once, empty and for the user alone: beside a new output (so a folder
+/// the user may not write is refused there too); for an existing one beside it
+/// (on Windows in the user's temporary folder) or, where that fails, in the
+/// other place.
 ///
-/// Commit() renames the temporary file over the output where that keeps the
-/// output's identity: a new output, or on POSIX the user's own regular file with
-/// one link and no extended attributes or access lists, given its group and mode.
-/// Any other existing output (on Windows every one) gets the new content copied
-/// in place and keeps its owner, permissions, links and attributes; when that
-/// copy fails its old content is put back where it can be, and the ChartError
-/// says which state the output was left in. A device or a pipe is written as it
-/// is.
+/// Commit() refuses (ChartError) when the output's name no longer leads to the
+/// file checked at the start. Otherwise it puts the temporary file's content in
+/// place with the library's rules for keeping an output's identity: a new
+/// output, or on POSIX the user's own regular file with one link and no extended
+/// attributes or access lists, is replaced by a complete new file with its group
+/// and mode; any other existing output (on Windows every one) gets the content
+/// written in place and keeps its owner, permissions, links and attributes;
+/// when that fails its old content is put back where it can be, and the
+/// ChartError says which state the output was left in. A device or a pipe is
+/// written as it is.
 class PendingOutput {
 public:
     explicit PendingOutput(std::string finalPath);
@@ -50,14 +54,14 @@ public:
     /// The temporary file's path (UTF-8) for the writer to fill; it exists, empty.
     const std::string& TemporaryPath() const { return temporary_; }
     /// Puts the written temporary file's content in place; ChartError on failure.
+    /// Call once.
     void Commit();
 
 private:
-    struct Target; // the output as the platform holds it open
+    struct Target; // the output, held open from the check to the commit
     std::string final_;
     std::string temporary_;
     std::unique_ptr<Target> target_;
-    bool committed_ = false;
 };
 
 } // namespace swatchlog
