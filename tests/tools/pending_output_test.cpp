@@ -6,6 +6,7 @@
 
 #include "file_paths.h"
 #include "temp_files.h"
+#include "tool_error.h"
 
 namespace swatchlog {
 namespace {
@@ -45,6 +46,53 @@ TEST(PendingOutput, AppearsOnlyOnCommitAndAnExistingOneKeepsItsHardLinks) {
         EXPECT_EQ(EntryCount(dir.path()), 2u);
     }
 }
+
+#if !defined(_WIN32)
+// The output checked at the start is the one committed to: when its name leads
+// elsewhere by then, nothing is written, neither there nor to the file checked.
+// (POSIX only: on Windows the check is not made.)
+TEST(PendingOutput, RefusesWhenTheOutputWasReplacedOrRemovedMeanwhile) {
+    enum class Change { Replaced, MovedAway, Removed };
+    const struct {
+        const char* what;
+        Change change;
+        std::string output; // what the output's name holds afterwards
+        std::size_t entries;
+    } cases[] = {
+        {"replaced", Change::Replaced, "other\n", 1},
+        {"moved away", Change::MovedAway, "", 1},
+        {"removed", Change::Removed, "", 0},
+    };
+    for (const auto& c : cases) {
+        SCOPED_TRACE(c.what);
+        const test_support::TempDir dir;
+        const fs::path output = dir.write("out.it8", "old\n");
+        {
+            PendingOutput pending(output.u8string());
+            WriteBytes(fs::u8path(pending.TemporaryPath()), "new\n");
+            if (c.change == Change::Replaced) {
+                fs::rename(dir.write("other", "other\n"), output);
+            } else if (c.change == Change::MovedAway) {
+                fs::rename(output, dir.file("moved"));
+            } else {
+                fs::remove(output);
+            }
+            std::string message;
+            try {
+                pending.Commit();
+            } catch (const ChartError& error) {
+                message = error.what();
+            }
+            EXPECT_NE(message.find("it was replaced or removed"), std::string::npos) << message;
+        }
+        EXPECT_EQ(ReadBytes(output), c.output);
+        EXPECT_EQ(EntryCount(dir.path()), c.entries);
+        if (c.change == Change::MovedAway) {
+            EXPECT_EQ(ReadBytes(dir.file("moved")), "old\n");
+        }
+    }
+}
+#endif
 
 } // namespace
 } // namespace swatchlog

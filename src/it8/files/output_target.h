@@ -42,8 +42,7 @@ public:
     /// opened (a link of the system's own kind).
     std::filesystem::path Folder() const;
     /// Whether the target's name still leads to the regular file opened; true
-    /// for the other kinds. (Always true on Windows, where an open file cannot
-    /// be renamed away without its sharing flags allowing it.)
+    /// for the other kinds. Not checked on Windows: always true there.
     bool StillNamed() const;
     /// Replaces the target's content by `content` and closes it. Call once,
     /// after a successful Open.
