@@ -23,9 +23,10 @@ namespace it8 {
 /// its creation. Every other existing file (on Windows every one) is rewritten
 /// in place and so keeps its owner, permissions, links and attributes; if that
 /// write fails the old content is put back, and where it cannot be (the old
-/// content could not be read, or putting it back failed too) the target is left
-/// empty. A device or pipe is written as it is. A folder is refused. In no case
-/// is part of the new text left behind.
+/// content could not be read, putting it back failed too, or the failure came
+/// after a longer old content's tail was cut) the target is left empty. A
+/// device or pipe is written as it is. A folder is refused. In no case is part
+/// of the new text left behind.
 bool WriteLinesToFile(const std::filesystem::path& target, const std::vector<std::string>& lines);
 
 } // namespace it8
