@@ -1,6 +1,7 @@
 #include "chart_model.h"
 
 #include <algorithm>
+#include <exception>
 #include <filesystem>
 #include <fstream>
 #include <sstream>
@@ -93,7 +94,7 @@ Chart Chart::Load(const std::string& path) {
     const std::wstring libraryPath = LibraryPath(path);
     std::error_code ec;
     if (std::filesystem::is_directory(FileSystemPath(path), ec)) {
-        throw ChartError(RepairUtf8(path) + ": is a folder, not a chart file");
+        throw ChartError(RepairUtf8(path) + ": is a folder, not a chart file", path, 0);
     }
     chart.store_.reset(CSwatchlogFactory::GetReaderWriter(CSwatchlogFactory::READERWRITER_IT8));
     if (!chart.store_) {
@@ -103,11 +104,14 @@ Chart Chart::Load(const std::string& path) {
     try {
         code = chart.store_->ReadChartFile(libraryPath);
     } catch (const std::exception& error) {
-        throw ChartError(RepairUtf8(path) + ": " + DescribeLibraryException(error));
+        // The library's own exception stays attached, for callers that tell its kind apart.
+        std::throw_with_nested(
+            ChartError(RepairUtf8(path) + ": " + DescribeLibraryException(error), path, 0));
     }
     if (code != 0) {
         throw ChartError(RepairUtf8(path) + ": " +
-                         WithCode(ExplainReadFailure(code, ScanChartFile(path)), code));
+                             WithCode(ExplainReadFailure(code, ScanChartFile(path)), code),
+                         path, code);
     }
     chart.fields_ = SplitWords(chart.store_->GetDataFormatLine());
     chart.patches_ = chart.store_->GetPatchList();

@@ -1,7 +1,6 @@
 // swatchlog convert: a clean CGATS file written from the chart by the library's
 // new-file writer.
 #include <algorithm>
-#include <array>
 
 #include "chart_model.h"
 #include "command_support.h"
@@ -23,52 +22,15 @@ const char* const kConvertHelp =
 
 namespace {
 
-// Keywords in the order a reader expects them; the rest follow by name.
-constexpr std::array<const char*, 12> kLeadingKeywords{
-    "ORIGINATOR",   "FILE_DESCRIPTOR", "DESCRIPTOR",         "CREATED",
-    "MANUFACTURER", "MANUFACTURE",     "PROD_DATE",          "SERIAL",
-    "MATERIAL",     "INSTRUMENTATION", "MEASUREMENT_SOURCE", "PRINT_CONDITIONS"};
-
-KeywordList OutputKeywords(const Chart& chart) {
-    KeywordList chartKeywords = chart.Keywords();
-    KeywordList out{{"CGATS.17", ""}};
-    auto add = [&out](const std::string& key, const std::string& value) {
-        if (!IsStandardKeyword(key)) {
-            out.emplace_back("KEYWORD", "\"" + key + "\"");
-        }
-        out.emplace_back(key, value);
-    };
-    for (const char* leading : kLeadingKeywords) {
-        for (const auto& [key, value] : chartKeywords) {
-            if (key == leading) {
-                add(key, value);
-            }
-        }
-    }
-    for (const auto& [key, value] : chartKeywords) {
-        const bool leading = std::find(kLeadingKeywords.begin(), kLeadingKeywords.end(), key) !=
-                             kLeadingKeywords.end();
-        if (!leading && key != "NUMBER_OF_FIELDS" && key != "NUMBER_OF_SETS" &&
-            IsValidKeywordName(key)) {
-            add(key, value);
-        }
-    }
-    // The file may name several process colours; the chart keeps their names.
-    std::vector<std::string> names;
-    if (chart.Store().GetProcessColorNames(names) == 0) {
-        out.emplace_back("KEYWORD", "\"PROCESSCOLOR_ID\"");
-        for (std::size_t i = 0; i < names.size(); ++i) {
-            out.emplace_back("PROCESSCOLOR_ID",
-                             "\"" + std::to_string(i + 1) + " " + names[i] + "\"");
-        }
-    }
-    return out;
-}
-
 void HandListsToStore(const Chart& chart, std::ostream& err) {
     CSwatchlogBase& store = chart.Store();
     const auto& patches = chart.Patches();
-    store.SetKeywordList(OutputKeywords(chart));
+    // The file may name several process colours; the chart keeps their names.
+    std::vector<std::string> processColors;
+    if (store.GetProcessColorNames(processColors) != 0) {
+        processColors.clear();
+    }
+    store.SetKeywordList(OutputKeywords(chart.Keywords(), processColors));
 
     const bool named = std::any_of(patches.begin(), patches.end(),
                                    [](const CColorPatch& p) { return !p.GetLabel().empty(); });

@@ -1,5 +1,7 @@
 #include "command_support.h"
 
+#include <exception>
+
 #include "chart_model.h"
 #include "file_paths.h"
 #include "result_messages.h"
@@ -50,8 +52,9 @@ OutputFormat ParseFormat(const ParsedArguments& parsed, const std::vector<std::s
 FailureText DefaultFailureText(const std::string& outputPath, const std::string& sourcePath) {
     return [outputPath, sourcePath](int code) {
         const bool sourceFault = (code == 21 || code == 22) && !sourcePath.empty();
-        return RepairUtf8(sourceFault ? sourcePath : outputPath) + ": " +
-               WithCode(DescribeWriteResult(code), code);
+        const std::string& blamed = sourceFault ? sourcePath : outputPath;
+        return ChartError(RepairUtf8(blamed) + ": " + WithCode(DescribeWriteResult(code), code),
+                          blamed, code);
     };
 }
 
@@ -63,10 +66,11 @@ void WriteOutputFile(const std::string& outputPath, const FailureText& failure,
     try {
         code = write(LibraryPath(pending.TemporaryPath()));
     } catch (const std::exception& error) {
-        throw ChartError(RepairUtf8(outputPath) + ": " + DescribeLibraryException(error));
+        std::throw_with_nested(ChartError(
+            RepairUtf8(outputPath) + ": " + DescribeLibraryException(error), outputPath, 0));
     }
     if (code != 0) {
-        throw ChartError(failure(code));
+        throw failure(code);
     }
     pending.Commit();
 }

@@ -7,6 +7,7 @@
 
 #include "arguments.h"
 #include "text_table.h"
+#include "tool_error.h"
 
 namespace swatchlog {
 
@@ -26,16 +27,18 @@ struct OutputFormat {
 OutputFormat ParseFormat(const ParsedArguments& parsed, const std::vector<std::string>& allowed);
 
 using WriteFunction = std::function<int(const std::wstring& temporaryPath)>;
-/// Turns a non-zero result code of a writer into the error message.
-using FailureText = std::function<std::string(int code)>;
+/// Turns a non-zero result code of a writer into the error, which names the
+/// file it blames and carries the code.
+using FailureText = std::function<ChartError(int code)>;
 
-/// The usual failure text: "FILE: reason [code N]", naming `sourcePath` for the
-/// codes that blame the source file (21, 22) and `outputPath` for the others.
+/// The usual failure: "FILE: reason [code N]", blaming `sourcePath` for the
+/// codes that concern the source file (21, 22) and `outputPath` for the others.
 FailureText DefaultFailureText(const std::string& outputPath, const std::string& sourcePath);
 
 /// Writes `outputPath` whole or not at all: `write` gets a temporary path and
 /// answers the library's result code; a non-zero code, an exception or a
-/// failed rename throw ChartError and leave no trace of the output.
+/// failed rename throw ChartError and leave no trace of the output. A library
+/// exception stays attached to the ChartError as its nested exception.
 void WriteOutputFile(const std::string& outputPath, const FailureText& failure,
                      const WriteFunction& write);
 

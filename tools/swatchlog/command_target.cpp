@@ -1,10 +1,7 @@
 // swatchlog target: the target file reduced to its clean and white patches.
-#include "chart_model.h"
+#include "chart_writers.h"
 #include "command_support.h"
 #include "commands.h"
-#include "file_paths.h"
-#include "tool_error.h"
-#include "utf8_text.h"
 
 namespace swatchlog {
 
@@ -20,19 +17,7 @@ int RunTarget(const Words& args, std::ostream& /*out*/, std::ostream& /*err*/) {
     RequirePositionals(parsed, 1, 1, "the chart file");
     const std::string input = parsed.positionals[0];
     const std::string output = RequireOutputPath(parsed, {input});
-    const Chart chart = Chart::Load(input);
-    const FailureText standard = DefaultFailureText(output, input);
-    const FailureText failure = [&](int code) {
-        if (code == 1) {
-            return RepairUtf8(input) + ": " +
-                   "the chart has no clean and no white patch (no patch prints a single "
-                   "colorant or none) [code 1]";
-        }
-        return standard(code);
-    };
-    WriteOutputFile(output, failure, [&](const std::wstring& temporary) {
-        return chart.Store().WriteTargetFile(LibraryPath(input), temporary);
-    });
+    WriteCleanTarget(input, output);
     return kExitSuccess;
 }
 

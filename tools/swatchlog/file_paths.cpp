@@ -23,7 +23,7 @@ fs::path FileSystemPath(const std::string& utf8Path) {
 std::wstring LibraryPath(const std::string& utf8Path) {
     std::wstring wide;
     if (!WideFromUtf8(utf8Path, wide)) {
-        throw ChartError(RepairUtf8(utf8Path) + ": the file name is not valid UTF-8");
+        throw ChartError(RepairUtf8(utf8Path) + ": the file name is not valid UTF-8", utf8Path, 0);
     }
     return wide;
 }
@@ -45,7 +45,7 @@ PendingOutput::PendingOutput(std::string finalPath) : final_(std::move(finalPath
     const fs::path target = FileSystemPath(final_);
     std::error_code ec;
     if (fs::is_directory(target, ec)) {
-        throw ChartError(final_ + ": is a folder, not a file");
+        throw ChartError(final_ + ": is a folder, not a file", final_, 0);
     }
     std::random_device random;
     const auto stamp = std::chrono::steady_clock::now().time_since_epoch().count();
@@ -67,7 +67,7 @@ void PendingOutput::Commit() {
     std::error_code ec;
     fs::rename(FileSystemPath(temporary_), FileSystemPath(final_), ec);
     if (ec) {
-        throw ChartError(final_ + ": cannot be written (" + ec.message() + ")");
+        throw ChartError(final_ + ": cannot be written (" + ec.message() + ")", final_, 0);
     }
     committed_ = true;
 }

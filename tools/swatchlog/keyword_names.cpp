@@ -7,6 +7,12 @@
 namespace swatchlog {
 namespace {
 
+// Keywords in the order a reader expects them; the rest follow in their own order.
+constexpr std::array<const char*, 12> kLeadingKeywords{
+    "ORIGINATOR",   "FILE_DESCRIPTOR", "DESCRIPTOR",         "CREATED",
+    "MANUFACTURER", "MANUFACTURE",     "PROD_DATE",          "SERIAL",
+    "MATERIAL",     "INSTRUMENTATION", "MEASUREMENT_SOURCE", "PRINT_CONDITIONS"};
+
 bool IsNumber(const std::string& text) {
     std::size_t i = (text[0] == '-' || text[0] == '+') ? 1 : 0;
     bool digits = false;
@@ -66,6 +72,41 @@ std::string KeywordValueText(const std::string& value, bool& ok) {
         return "";
     }
     return "\"" + inner + "\"";
+}
+
+std::vector<std::pair<std::string, std::string>>
+OutputKeywords(const std::vector<std::pair<std::string, std::string>>& keywords,
+               const std::vector<std::string>& processColors) {
+    std::vector<std::pair<std::string, std::string>> out{{"CGATS.17", ""}};
+    auto add = [&out](const std::string& key, const std::string& value) {
+        if (!IsStandardKeyword(key)) {
+            out.emplace_back("KEYWORD", "\"" + key + "\"");
+        }
+        out.emplace_back(key, value);
+    };
+    for (const char* leading : kLeadingKeywords) {
+        for (const auto& [key, value] : keywords) {
+            if (key == leading) {
+                add(key, value);
+            }
+        }
+    }
+    for (const auto& [key, value] : keywords) {
+        const bool leading = std::find(kLeadingKeywords.begin(), kLeadingKeywords.end(), key) !=
+                             kLeadingKeywords.end();
+        if (!leading && key != "NUMBER_OF_FIELDS" && key != "NUMBER_OF_SETS" &&
+            IsValidKeywordName(key)) {
+            add(key, value);
+        }
+    }
+    if (!processColors.empty()) {
+        out.emplace_back("KEYWORD", "\"PROCESSCOLOR_ID\"");
+        for (std::size_t i = 0; i < processColors.size(); ++i) {
+            out.emplace_back("PROCESSCOLOR_ID",
+                             "\"" + std::to_string(i + 1) + " " + processColors[i] + "\"");
+        }
+    }
+    return out;
 }
 
 } // namespace swatchlog

@@ -3,6 +3,8 @@
 #pragma once
 
 #include <string>
+#include <utility>
+#include <vector>
 
 namespace swatchlog {
 
@@ -18,5 +20,15 @@ bool IsValidKeywordName(const std::string& keyword);
 /// double quotes. Empty when the value cannot be written (line breaks, or
 /// double quotes inside it).
 std::string KeywordValueText(const std::string& value, bool& ok);
+
+/// The keyword lines of a new chart file: "CGATS.17" first, the common
+/// descriptive keywords in the order readers expect, the others by their order
+/// in `keywords`, each keyword the format does not define declared by a KEYWORD
+/// line, then the process colour names as numbered PROCESSCOLOR_ID lines.
+/// NUMBER_OF_FIELDS, NUMBER_OF_SETS and names that cannot stand as keywords are
+/// left out (the writer adds the counts itself).
+std::vector<std::pair<std::string, std::string>>
+OutputKeywords(const std::vector<std::pair<std::string, std::string>>& keywords,
+               const std::vector<std::string>& processColors);
 
 } // namespace swatchlog
