@@ -15,10 +15,13 @@ rm -rf "$venv" python/build python/redavudeva.egg-info
 # --no-index: everything comes from Debian's packages; nothing is downloaded.
 "$venv/bin/pip" install --quiet --no-build-isolation --no-index ./python
 
-built_tool="$PWD/build/dev/tools/swatchlog/swatchlog"
+# The tests compare with the tool of the dev build where there is one.
+repo="$PWD"
+tool="$repo/build/dev/tools/swatchlog/swatchlog"
+[ -x "$tool" ] || tool=""
 work="$(mktemp -d)"
 trap 'rm -rf "$work"' EXIT
 cd "$work"
-REDAVUDEVA_EXAMPLES="$OLDPWD/examples" SWATCHLOG="$([ -x "$built_tool" ] && echo "$built_tool")" \
-    PYTHONDONTWRITEBYTECODE=1 "$venv/bin/python" -m pytest -q -p no:cacheprovider "$OLDPWD/python/tests"
-"$venv/bin/python" -c 'import redavudeva, sys; sys.exit(0 if "build/python-venv" in redavudeva.__file__ else 1)'
+"$venv/bin/python" -c 'import redavudeva, sys; sys.exit(0 if "/build/python-venv/" in redavudeva.__file__ else 1)'
+REDAVUDEVA_EXAMPLES="$repo/examples" SWATCHLOG="$tool" PYTHONDONTWRITEBYTECODE=1 \
+    "$venv/bin/python" -m pytest -q -p no:cacheprovider "$repo/python/tests"
