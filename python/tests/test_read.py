@@ -1,15 +1,11 @@
 """Reading charts into arrays: each colour space, NaN where a value is missing,
 what the library derived, spectra on their wavelengths."""
 
-import pathlib
-
 import numpy as np
 import pytest
 
 import redavudeva
 from conftest import EXAMPLES, chart_text
-
-NAN = np.nan
 
 # Each case: fields and rows of a file, the attribute, its expected rows (from
 # the file), and the device space the tool reports.

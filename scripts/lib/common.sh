@@ -37,7 +37,7 @@ BUILD_PACKAGES=(cmake ninja-build g++ clang libgtest-dev libbenchmark-dev liblcm
 
 # Packages of installing the Python package with pip into a virtual environment.
 PYTHON_PACKAGES=(cmake ninja-build g++ pybind11-dev python3-dev python3-numpy python3-pytest python3-pip
-    python3-setuptools python3-venv)
+    python3-setuptools python3-venv python3-wheel)
 
 section() {
     echo
