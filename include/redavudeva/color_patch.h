@@ -80,7 +80,15 @@ public:
 
     /// Marks the spaces whose bit is clear as present and derives the missing ones
     /// it can (CMYK, XYZ, densities from the spectrum; Lab from XYZ; XYZ from Lab;
-    /// RGB from XYZ or CMYK).
+    /// RGB from XYZ or from CMYK the row supplied).
+    /// The spectrum reaches the colour engine as 10 nm values within 380..780 nm:
+    /// names 10 nm apart there pass unchanged; any other step, range or uneven
+    /// spacing is resampled (a cubic curve through the points, or a least-squares
+    /// fit where they are closer than 10 nm), and points outside 380..780 nm are
+    /// left out. A spectrum that cannot give colour (fewer than two values, a
+    /// non-finite value, two values at one wavelength, an unreadable field name,
+    /// nothing within 380..780 nm) derives nothing and raises no flag. CMYK derived
+    /// from an off-grid spectrum is the marker -1, 0, 0, 0 and never yields RGB.
     void SetMissingColorSpace(std::uint32_t mask);
     /// Sets the reference white used by later Lab and relative-XYZ computations.
     void SetNormLight(tagXYZ white);
@@ -142,6 +150,11 @@ private:
     bool m_bHTMLCOLOR = false;
     bool m_bNColor = false;
     bool m_bDensity = false;
+    /// The spectral names lie 10 nm apart within 380..780 nm and every value fits a
+    /// float: m_spectral reaches the colour engine as it is. Set with m_spectral;
+    /// it sits in what was padding before m_missingMask, so the object's size and
+    /// the other members' places are as before.
+    bool m_bSpectralOnEngineGrid = false;
     std::uint32_t m_missingMask = 0;
     double m_normWeighting[4] = {};
     std::string m_label;

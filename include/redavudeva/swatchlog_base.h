@@ -48,6 +48,32 @@ using NColorMap = std::map<int, tagNCLR>;
 /// 19 channel out of range; 21 source unreadable; 22 source not a readable chart;
 /// 23 target cannot be written; 24 store data do not fit the source; 25 no
 /// reference samples.
+///
+/// Reading a chart file (ReadChartFile, and the source of every writer):
+/// - Only a regular file is read; a folder, a device or a pipe answers 3 (21 as a
+///   writer's source) without a byte being read. The file is read whole, with its
+///   length taken when it is opened.
+/// - A UTF-8 byte-order mark at the start is skipped.
+/// - Line ends: a file whose first line (up to its first LF) holds at most 1023
+///   characters is read with LF line ends (a CR before an LF belongs to the line
+///   end, any other CR separates tokens). A longer first line with a CR within
+///   its first 1023 characters, or a file without any LF that holds a CR, is read
+///   with CR line ends. Lines may be of any length; a NUL ends a line.
+/// - Limits that keep memory proportional to the file: a field name of the data
+///   format longer than 1023 characters answers 5; a data row answers 8 unless it
+///   holds at least as many values as the format has spectral and n-colour
+///   fields (every patch carries its own copy of those names). Peak memory while
+///   reading is then at most about 1.1 KiB per byte of the file (a patch is about
+///   1 KiB, the shortest row is two bytes) plus the file itself.
+///
+/// Writing a target (every writer): whether it may be written is decided by
+/// opening it for writing; a symbolic link is followed, a loop answers 23. A new
+/// target appears only when complete. An existing target keeps its owner, group,
+/// mode, hard links, access lists and extended attributes: where replacing it
+/// by a renamed temporary file would lose any of these (and always on Windows)
+/// it is rewritten in place. On failure (23) the target holds its old content,
+/// or, when that could not be read or put back, is left empty; it never holds a
+/// part of the new text. A source may also be the target.
 class CSwatchlogBase {
 public:
     CSwatchlogBase();
@@ -103,7 +129,11 @@ public:
     virtual int FindClosestPatch(const tagCMYKOG& target);
     virtual int FindClosestPatch(const tagCMYKRGB& target, double maximumDistance);
     virtual int FindClosestPatch(const tagCMYKRGB& target);
-    /// Record of one patch: 0, 11 (no patches), 12 (space not carried), 10 (no such sample).
+    /// Record of one patch: 0, 11 (no patches), 12 (space not carried by the chart),
+    /// 10 (no such sample), 12 (that patch does not hold the space, e.g. its spectrum
+    /// gave no colour: one value, a non-finite value, nothing within 380..780 nm).
+    /// Changed: the per-patch 12 is new; these queries used to answer 0 with the
+    /// patch's unset (zero) record.
     virtual int GetPatchCMYK(int sampleNumber, tagCMYK& cmyk);
     virtual int GetPatchCMYKOG(int sampleNumber, tagCMYKOG& cmykog);
     virtual int GetPatchCMYKRGB(int sampleNumber, tagCMYKRGB& cmykrgb);
@@ -111,7 +141,9 @@ public:
     virtual int GetPatchLAB(int sampleNumber, tagLAB& lab);
     virtual int GetPatchRGB(int sampleNumber, tagRGB& rgb);
     virtual int GetPatchDensity(int sampleNumber, tagDENSITY& density);
-    /// Every patch's record in sample order: 0, 11 (no patches), 12 (space not carried).
+    /// Every patch's record in sample order: 0, 11 (no patches), 12 (space not carried
+    /// by the chart, or not held by one of its patches; the list is then untouched).
+    /// Changed: a patch that lacks the space used to contribute a zero record.
     virtual int CollectCMYK(std::vector<tagCMYK>& list);
     virtual int CollectCMYKOG(std::vector<tagCMYKOG>& list);
     virtual int CollectCMYKO(std::vector<SWL_CMYKO>& list);
@@ -121,17 +153,18 @@ public:
     virtual int CollectLAB(std::vector<tagLAB>& list);
     virtual int CollectRGB(std::vector<tagRGB>& list);
     virtual int CollectHTMLCOLOR(std::vector<tagHTMLCOLOR>& list);
-    /// Every patch's n-colour map: 0 or 12.
+    /// Every patch's n-colour map: 0 or 12 (not carried, or a patch without channels).
     virtual int CollectNColorMaps(std::vector<std::map<int, tagNCLR>>& list);
     /// Device values of every patch as lists of numbers: 0, 12; base version 24.
     virtual int GetDeviceValueLists(std::vector<std::vector<double>>& lists);
-    /// Every patch's densities in sample order: 0, 11, 12.
+    /// Every patch's densities in sample order: 0, 11, 12 (as for the records above).
     virtual int CollectDensities(std::vector<tagDENSITY>& list);
     /// Sets the strip layout: 0, or 15 for a count below 1.
     virtual int SetLayout(int strips, int columns);
     /// Sets the page count: 0, or 18 for a count below 1.
     virtual int SetNumberOfPages(int pages);
-    /// Records of one strip (1-based): 0, 12, 15, 16, 17.
+    /// Records of one strip (1-based): 0, 12, 15, 16, 17; also 12 (new) when a patch
+    /// of that strip does not hold the space.
     virtual int CollectStripRGB(int strip, std::vector<tagRGB>& list);
     virtual int CollectStripLAB(int strip, std::vector<tagLAB>& list);
     virtual int CollectStripXYZ(int strip, std::vector<tagXYZ>& list);
@@ -190,7 +223,12 @@ public:
     virtual void SetXYZList(const std::vector<tagXYZ>& list);
     virtual void SetLABList(const std::vector<tagLAB>& list);
     virtual void SetRGBList(const std::vector<tagRGB>& list);
-    /// Sets the spectra to be written; with `compute` also XYZ, Lab and densities.
+    /// Sets the spectra to be written; with `compute` also XYZ, Lab and densities, one
+    /// entry each per spectrum that gives colour. Each spectrum is read on the
+    /// wavelengths of its own field names; any step or range is brought onto 10 nm
+    /// steps within 380..780 nm first (see CColorPatch::SetMissingColorSpace). A
+    /// spectrum with an unreadable name, one value, a non-finite value or nothing
+    /// within 380..780 nm is skipped.
     virtual void SetSpectralDataList(const std::vector<std::map<std::string, double>>& list,
                                      bool compute);
     virtual void SetNColorList(const std::vector<std::map<int, tagNCLR>>& list);

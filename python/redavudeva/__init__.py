@@ -7,7 +7,7 @@ the writers that start from an existing file; ``delta_e()`` computes CIEDE2000
 and CIE76 colour differences. Failures raise :class:`ChartError`.
 """
 
-from ._redavudeva import Chart, ChartError, delta_e, merge, read, write_target
+from ._redavudeva import Chart, ChartError, Table, delta_e, merge, read, write_target
 
-__all__ = ["Chart", "ChartError", "delta_e", "merge", "read", "write_target"]
+__all__ = ["Chart", "ChartError", "Table", "delta_e", "merge", "read", "write_target"]
 __version__ = "0.1.0"

@@ -133,10 +133,8 @@ ChartObject ChartFromArrays(py::object names, py::object cmyk, py::object rgb, p
 
     ChartObject chart;
     const auto patches = static_cast<std::size_t>(count < 0 ? 0 : count);
-    chart.sampleIds = py::array_t<std::int64_t>(static_cast<py::ssize_t>(patches));
-    for (std::size_t i = 0; i < patches; ++i) {
-        chart.sampleIds.mutable_at(i) = static_cast<std::int64_t>(i + 1);
-    }
+    chart.sampleNumbers = SampleNumbers(patches);
+    chart.sampleIds = NumbersAsIds(patches);
     chart.names = nameList;
     for (std::size_t i = nameList.size(); i < patches; ++i) {
         chart.names.append(py::str(""));

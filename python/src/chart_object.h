@@ -9,10 +9,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <string>
-
-namespace swatchlog {
-class Chart;
-}
+#include <vector>
 
 namespace redavudeva_python {
 
@@ -29,9 +26,23 @@ struct FixedSpace {
 constexpr std::array<FixedSpace, 5> kFixedSpaces{
     {{"cmyk", 4}, {"rgb", 3}, {"xyz", 3}, {"lab", 3}, {"density", 4}}};
 
+/// One table of a chart file, as the tool lists it.
+struct TableInfo {
+    int number = 0;    ///< 1 for the file's first table
+    int firstLine = 0; ///< 1-based line numbers in the file, both included
+    int lastLine = 0;
+    int dataLine = 0;       ///< its BEGIN_DATA line, 0 when it has no data block
+    int rows = 0;           ///< data rows of its data block
+    py::tuple fields;       ///< data format names (str), upper case
+    py::str identification; ///< the word alone on its first line, "" when none
+};
+
 struct ChartObject {
-    py::object path = py::none(); ///< the file read, None for a chart built from arrays
-    py::array_t<std::int64_t> sampleIds;
+    py::object path = py::none();  ///< the file read, None for a chart built from arrays
+    std::vector<TableInfo> tables; ///< every table of the file read; empty for a built chart
+    int table = 0;                 ///< the number of the table read, 0 for a built chart
+    py::array_t<std::int64_t> sampleNumbers;
+    py::array sampleIds; ///< str array
     py::list names;
     py::dict keywords;
     std::string device = "none";
@@ -42,17 +53,22 @@ struct ChartObject {
     FloatArray spectra;
     py::dict derived; ///< space name -> bool array (patches,)
 
-    std::size_t Size() const { return static_cast<std::size_t>(sampleIds.size()); }
+    std::size_t Size() const { return static_cast<std::size_t>(sampleNumbers.size()); }
     FloatArray Fixed(const char* key) const { return fixed[key].cast<FloatArray>(); }
 };
 
 /// An array of `rows` x `columns` NaN.
 FloatArray NanArray(std::size_t rows, std::size_t columns);
 
-/// The Python chart of a chart the tool has read (one table of a file).
-ChartObject ChartFromToolChart(const swatchlog::Chart& chart);
-/// Reads the chart file at `utf8Path`; the tool's ChartError when it cannot.
-ChartObject ReadChart(const std::string& utf8Path);
+/// Reads table `table` (1-based; 0: the first with data rows, as the tool
+/// does) of the chart file at `utf8Path`; the tool's TableReadError when it
+/// cannot.
+ChartObject ReadChart(const std::string& utf8Path, int table);
+
+/// Sample numbers 1 ... `count` (int64) and the same as text, the sample ids
+/// of a chart whose file gives none.
+py::array_t<std::int64_t> SampleNumbers(std::size_t count);
+py::array NumbersAsIds(std::size_t count);
 
 /// A chart from arrays and lists (None for what is not given); ValueError or
 /// TypeError when they do not fit together.

@@ -34,15 +34,16 @@ bool Carries(const FloatArray& values) {
 // ValueError unless every value of a space to be written is a finite number:
 // the file has a cell for every patch and no notation for a missing value.
 void RequireComplete(const FloatArray& values, const char* name,
-                     const py::array_t<std::int64_t>& sampleIds) {
+                     const py::array_t<std::int64_t>& sampleNumbers) {
     const auto rows = values.unchecked<2>();
     for (py::ssize_t i = 0; i < rows.shape(0); ++i) {
         for (py::ssize_t c = 0; c < rows.shape(1); ++c) {
             if (!std::isfinite(rows(i, c))) {
                 throw py::value_error(std::string(name) + " of sample " +
-                                      std::to_string(sampleIds.at(i)) +
+                                      std::to_string(sampleNumbers.at(i)) +
                                       " is not a finite number; a written colour space needs a "
-                                      "value for every patch");
+                                      "value for every patch (a space that is NaN throughout "
+                                      "is left out)");
             }
         }
     }
@@ -89,7 +90,7 @@ KeywordList KeywordsToWrite(const ChartObject& chart) {
         }
         keywords.emplace_back(key, value);
     }
-    return swatchlog::OutputKeywords(keywords, {});
+    return swatchlog::NewFileKeywordLines(std::move(keywords));
 }
 
 template <typename Record, typename Make>
@@ -148,7 +149,7 @@ bool FillStore(const ChartObject& chart, CSwatchlogBase& store) {
         if (!Carries(values)) {
             return std::nullopt;
         }
-        RequireComplete(values, key, chart.sampleIds);
+        RequireComplete(values, key, chart.sampleNumbers);
         any = true;
         return values;
     };
@@ -176,7 +177,7 @@ bool FillStore(const ChartObject& chart, CSwatchlogBase& store) {
     }
     const std::vector<std::string> channels = ChannelNames(chart);
     if (!channels.empty() && Carries(chart.ncolor)) {
-        RequireComplete(chart.ncolor, "ncolor", chart.sampleIds);
+        RequireComplete(chart.ncolor, "ncolor", chart.sampleNumbers);
         store.SetNColorList(Records<std::map<int, tagNCLR>>(chart.ncolor, [&](auto v) {
             std::map<int, tagNCLR> map;
             for (std::size_t c = 0; c < channels.size(); ++c) {
@@ -191,7 +192,7 @@ bool FillStore(const ChartObject& chart, CSwatchlogBase& store) {
         any = true;
     }
     if (chart.wavelengths.size() > 0 && Carries(chart.spectra)) {
-        RequireComplete(chart.spectra, "spectra", chart.sampleIds);
+        RequireComplete(chart.spectra, "spectra", chart.sampleNumbers);
         const std::vector<std::string> fields = SpectralFields(chart.wavelengths);
         store.SetSpectralDataList(Records<std::map<std::string, double>>(
                                       chart.spectra,
@@ -225,7 +226,7 @@ void WriteChart(const ChartObject& chart, const std::string& utf8Path) {
     store->SetSampleNameList(NamesToWrite(chart));
     store->SetKeywordList(KeywordsToWrite(chart));
     py::gil_scoped_release unlocked;
-    swatchlog::WriteOutputFile(utf8Path, swatchlog::DefaultFailureText(utf8Path, ""),
+    swatchlog::WriteOutputFile(utf8Path, swatchlog::DefaultFailureText(utf8Path),
                                [&store](const std::wstring& temporary) {
                                    return store->WriteChartFile(L"", temporary, false);
                                });

@@ -5,6 +5,8 @@
 #include <pybind11/stl.h>
 
 #include <string>
+#include <utility>
+#include <vector>
 
 #include "chart_errors.h"
 #include "chart_object.h"
@@ -17,6 +19,7 @@
 namespace py = pybind11;
 using namespace pybind11::literals;
 using redavudeva_python::ChartObject;
+using redavudeva_python::TableInfo;
 
 namespace {
 
@@ -30,11 +33,18 @@ constexpr const char* kModuleDoc =
 
 constexpr const char* kReadDoc =
     "Read the chart file at `path` (str, bytes or os.PathLike).\n\n"
+    "A file may hold several tables one after another, each with its own\n"
+    "header, data format and data block (a profiling tool's measurement file,\n"
+    "calibration curves ...). `table` picks one by its number, 1 for the first,\n"
+    "as 'swatchlog --table N' does; by default the first table with data rows\n"
+    "is read. Chart.tables lists them all.\n\n"
     "The library derives what a data row lacks where it can (XYZ and densities\n"
     "from the spectrum, L*a*b* from XYZ, XYZ from L*a*b*, RGB from XYZ or CMYK);\n"
     "Chart.derived tells those values apart. Raises ChartError when the file\n"
-    "cannot be read (with the library's result code), ValueError or IndexError\n"
-    "when a layout keyword or spectral field name holds no usable number.\n";
+    "or the table cannot be read (with the library's result code, the table and\n"
+    "the line), IndexError when the file has no table of that number,\n"
+    "ValueError for a table number below 1, and ValueError or IndexError when\n"
+    "a layout keyword or spectral field name holds no usable number.\n";
 
 constexpr const char* kChartDoc =
     "One chart: its patches in sample-number order and its header keywords.\n\n"
@@ -71,21 +81,41 @@ constexpr const char* kWriteDoc =
 
 constexpr const char* kMergeDoc =
     "Put the measurements of the chart file `measured` (L*a*b*, XYZ, spectra and\n"
-    "the densities computed from them) into the target file `target` and write\n"
-    "the result to `output`, as 'swatchlog merge' does.\n\n"
+    "the densities computed from the spectra) into the target file `target` and\n"
+    "write the result to `output`, as 'swatchlog merge' does.\n\n"
+    "Each target patch takes the measurement of its partner in `measured`: by\n"
+    "SAMPLE_ID when both files carry it, else by sample name, else by position;\n"
+    "`by` (\"auto\", \"id\", \"name\", \"position\") chooses one rule. Every\n"
+    "target patch needs a partner; measured patches without one are an error\n"
+    "unless allow_unpaired. Where both files carry device values (CMYK, RGB or\n"
+    "n-colour channels) every pair must agree within device_tolerance (percent\n"
+    "or RGB levels), so that measurements of another chart are not merged.\n\n"
     "By default the data block is rebuilt from the target's device values and\n"
     "the measurements; with append_missing the target's rows are kept and the\n"
-    "colour spaces it lacks are appended, and exact then requires the patch\n"
-    "counts to agree exactly. Raises ValueError when `output` is one of the\n"
-    "inputs, ChartError when a file cannot be read or written or the\n"
-    "measurements do not fit the target (code 24).\n";
+    "colour spaces it lacks are appended, and exact then works the larger of\n"
+    "ORIGINAL_NUMBER_OF_SETS and NUMBER_OF_SETS rather than the smaller.\n"
+    "target_table and measured_table pick a table of a file of several (1 for\n"
+    "the first; default: the first with data rows); `output` holds the\n"
+    "target's table alone. The notes the tool prints (the pairing rule used,\n"
+    "patches left out, device values not compared) are issued as UserWarning.\n\n"
+    "The output appears whole or not at all. Raises ValueError when `output` is\n"
+    "one of the inputs or an option is out of range, ChartError when a file\n"
+    "cannot be read or written, the pairing or the device values refuse the\n"
+    "merge, or the measurements do not fit the target (code 24); its message is\n"
+    "the tool's, which names the command-line options (--allow-unpaired,\n"
+    "--by, --device-tolerance) for the arguments of the same names.\n";
 
 constexpr const char* kTargetDoc =
     "Write the chart file `chart` reduced to its clean patches (one colorant\n"
     "alone) and its first white patch to `output`, with the layout keywords set\n"
-    "to the new patch count, as 'swatchlog target' does. Raises ValueError when\n"
+    "to the new patch count, as 'swatchlog target' does. The library's writer\n"
+    "stops at the first white patch, so clean patches after it would be lost:\n"
+    "then nothing is written unless force, which writes the file and issues\n"
+    "the loss as a UserWarning. `table` picks a table of a file of several (1\n"
+    "for the first; default: the first with data rows). Raises ValueError when\n"
     "`output` is `chart` itself, ChartError when a file cannot be read or\n"
-    "written or the chart has no clean and no white patch (code 1).\n";
+    "written, clean patches would be lost, or the chart has no clean and no\n"
+    "white patch (code 1).\n";
 
 constexpr const char* kDeltaEDoc =
     "Colour differences between L*a*b* colours, with the swatchlog tool's code.\n\n"
@@ -108,19 +138,122 @@ py::object Fixed(const ChartObject& chart, const char* key) {
     return chart.fixed[key];
 }
 
+// The table number argument as the tool's functions take it (0: the default).
+int TableArgument(const py::object& table, const char* name) {
+    if (table.is_none()) {
+        return 0;
+    }
+    const auto number = table.cast<long long>();
+    if (number < 1 || number > 1000000) {
+        throw py::value_error(std::string(name) + " is a table number from 1, not " +
+                              std::to_string(number));
+    }
+    return static_cast<int>(number);
+}
+
+swatchlog::PairBy PairByArgument(const std::string& by) {
+    const std::pair<const char*, swatchlog::PairBy> rules[] = {
+        {"auto", swatchlog::PairBy::Auto},
+        {"id", swatchlog::PairBy::Id},
+        {"name", swatchlog::PairBy::Name},
+        {"position", swatchlog::PairBy::Position}};
+    for (const auto& [key, rule] : rules) {
+        if (by == key) {
+            return rule;
+        }
+    }
+    throw py::value_error("by must be \"auto\", \"id\", \"name\" or \"position\", not \"" + by +
+                          "\"");
+}
+
+// Runs a writer without the interpreter lock and issues the remarks it made
+// as UserWarnings once it has finished.
+template <typename Run> void WithRemarks(Run run) {
+    std::vector<std::string> remarks;
+    {
+        py::gil_scoped_release unlocked;
+        run([&remarks](const std::string& text) { remarks.push_back(text); });
+    }
+    const py::object warn = py::module_::import("warnings").attr("warn");
+    for (const auto& text : remarks) {
+        warn(redavudeva_python::TextFromBytes(text), py::handle(PyExc_UserWarning), 2);
+    }
+}
+
+py::tuple Tables(const ChartObject& chart) {
+    py::list tables;
+    for (const auto& table : chart.tables) {
+        tables.append(py::cast(table));
+    }
+    return py::tuple(tables);
+}
+
 } // namespace
 
 PYBIND11_MODULE(_redavudeva, module) {
     module.doc() = kModuleDoc;
     redavudeva_python::RegisterChartError(module);
 
+    py::class_<TableInfo> table(module, "Table",
+                                "One table of a chart file: a header, a data format and a data "
+                                "block,\nended by its END_DATA. Chart.tables lists them.");
+    table.def_readonly("number", &TableInfo::number,
+                       "The table's number in its file, 1 for the first (read(table=...)).");
+    table.def_readonly("first_line", &TableInfo::firstLine,
+                       "The table's first line in the file (counted from 1).");
+    table.def_readonly("last_line", &TableInfo::lastLine,
+                       "The table's last line in the file, its END_DATA line or the file's "
+                       "end.");
+    table.def_property_readonly(
+        "data_line",
+        [](const TableInfo& t) {
+            return t.dataLine > 0 ? py::object(py::int_(t.dataLine)) : py::object(py::none());
+        },
+        "The line of its BEGIN_DATA, or None when it has no data block.");
+    table.def_readonly("rows", &TableInfo::rows, "The number of data rows in its data block.");
+    table.def_readonly("fields", &TableInfo::fields,
+                       "The data format's field names (tuple of str), upper case, in column "
+                       "order.");
+    table.def_readonly("identification", &TableInfo::identification,
+                       "The word alone on the table's first line (\"CGATS.17\", \"CTI3\", "
+                       "\"IT8.7/2\" ...),\nor \"\" when that line holds anything else.");
+    table.def(
+        "__repr__",
+        [](const TableInfo& t) {
+            return "<redavudeva.Table " + std::to_string(t.number) + ": lines " +
+                   std::to_string(t.firstLine) + "-" + std::to_string(t.lastLine) + ", " +
+                   std::to_string(t.rows) + (t.rows == 1 ? " row" : " rows") + ", " +
+                   std::to_string(t.fields.size()) + " fields>";
+        },
+        "Number, lines, rows and field count.");
+
     py::class_<ChartObject> chart(module, "Chart", kChartDoc);
     chart.def_property_readonly(
         "path", [](const ChartObject& c) { return c.path; },
         "The file the chart was read from (str), or None for a chart built from arrays.");
     chart.def_property_readonly(
+        "tables", Tables,
+        "Every table of the file read (tuple of Table), one for a file of one table;\n"
+        "empty for a chart built from arrays.");
+    chart.def_property_readonly(
+        "table",
+        [](const ChartObject& c) {
+            return c.table > 0 ? py::object(py::int_(c.table)) : py::object(py::none());
+        },
+        "The number of the table this chart holds (1 for the first), None for a\n"
+        "chart built from arrays.");
+    chart.def_property_readonly(
+        "sample_numbers", [](const ChartObject& c) { return c.sampleNumbers; },
+        "Sample numbers 1 ... N of the patches, in data-row order (int64 array):\n"
+        "the numbers the library and the tool count patches by.");
+    chart.def_property_readonly(
         "sample_ids", [](const ChartObject& c) { return c.sampleIds; },
-        "Sample numbers 1 ... N of the patches, in data-row order (int64 array).");
+        "The file's SAMPLE_ID of each patch as text (NumPy str array), without\n"
+        "the double quotes a file may put around it: ids such as \"A01\" stay\n"
+        "as they are, numbers keep the digits the file has (\"007\"). When the\n"
+        "file has no SAMPLE_ID field, and for a chart built from arrays, the\n"
+        "sample numbers as text (\"1\", \"2\" ...), which is what write() writes.\n"
+        "int(...) or .astype(int) turns numeric ids into numbers.");
     chart.def_property_readonly(
         "names", [](const ChartObject& c) { return c.names; },
         "Sample names (list of str) without the double quotes a file may put around\n"
@@ -193,34 +326,56 @@ PYBIND11_MODULE(_redavudeva, module) {
 
     module.def(
         "read",
-        [](const py::object& path) {
-            return redavudeva_python::ReadChart(redavudeva_python::PathArgument(path));
+        [](const py::object& path, const py::object& table) {
+            const int number = TableArgument(table, "table");
+            return redavudeva_python::ReadChart(redavudeva_python::PathArgument(path), number);
         },
-        kReadDoc, "path"_a);
+        kReadDoc, "path"_a, "table"_a = py::none());
     module.def(
         "merge",
         [](const py::object& target, const py::object& measured, const py::object& output,
-           bool appendMissing, bool exact) {
+           bool appendMissing, bool exact, const std::string& by, bool allowUnpaired,
+           double deviceTolerance, const py::object& targetTable, const py::object& measuredTable) {
+            swatchlog::MergeOptions options;
+            if (exact && !appendMissing) {
+                throw py::value_error("exact goes with append_missing");
+            }
+            if (!(deviceTolerance >= 0.0 && deviceTolerance <= 1e6)) {
+                throw py::value_error("device_tolerance is a number from 0, not " +
+                                      std::string(py::str(py::float_(deviceTolerance))));
+            }
+            options.appendMissing = appendMissing;
+            options.exact = exact;
+            options.by = PairByArgument(by);
+            options.allowUnpaired = allowUnpaired;
+            options.deviceTolerance = deviceTolerance;
+            options.targetTable = TableArgument(targetTable, "target_table");
+            options.measuredTable = TableArgument(measuredTable, "measured_table");
             const std::string targetPath = redavudeva_python::PathArgument(target);
             const std::string measuredPath = redavudeva_python::PathArgument(measured);
             const std::string outputPath = redavudeva_python::PathArgument(output);
             RequireSeparateOutput(outputPath, {targetPath, measuredPath});
-            py::gil_scoped_release unlocked;
-            swatchlog::MergeMeasurements(targetPath, measuredPath, outputPath, appendMissing,
-                                         exact);
+            WithRemarks([&](const swatchlog::Remark& note) {
+                swatchlog::MergeMeasurements(targetPath, measuredPath, outputPath, options, note);
+            });
         },
         kMergeDoc, "target"_a, "measured"_a, "output"_a, py::kw_only(), "append_missing"_a = false,
-        "exact"_a = false);
+        "exact"_a = false, "by"_a = "auto", "allow_unpaired"_a = false, "device_tolerance"_a = 1.0,
+        "target_table"_a = py::none(), "measured_table"_a = py::none());
     module.def(
         "write_target",
-        [](const py::object& chartPath, const py::object& output) {
+        [](const py::object& chartPath, const py::object& output, const py::object& table,
+           bool force) {
+            const int number = TableArgument(table, "table");
             const std::string input = redavudeva_python::PathArgument(chartPath);
             const std::string outputPath = redavudeva_python::PathArgument(output);
             RequireSeparateOutput(outputPath, {input});
-            py::gil_scoped_release unlocked;
-            swatchlog::WriteCleanTarget(input, outputPath);
+            WithRemarks([&](const swatchlog::Remark& warning) {
+                swatchlog::WriteCleanTarget(input, outputPath, number, force, warning);
+            });
         },
-        kTargetDoc, "chart"_a, "output"_a);
+        kTargetDoc, "chart"_a, "output"_a, py::kw_only(), "table"_a = py::none(),
+        "force"_a = false);
     module.def("delta_e", &redavudeva_python::DeltaE, kDeltaEDoc, "lab1"_a, "lab2"_a,
                "method"_a = "CIE2000");
 }

@@ -36,7 +36,7 @@ def test_missing_file_and_unwritable_output(tmp_path):
     assert (raised.value.code, raised.value.path) == (3, str(tmp_path / "absent.it8"))
     with pytest.raises(redavudeva.ChartError, match="is a folder") as raised:
         redavudeva.read(tmp_path)
-    assert (raised.value.code, raised.value.path) == (None, str(tmp_path))
+    assert (raised.value.code, raised.value.path) == (3, str(tmp_path))
     chart = redavudeva.Chart.from_arrays(lab=[[50, 0, 0]])
     with pytest.raises(redavudeva.ChartError) as raised:
         chart.write(tmp_path / "no such folder" / "out.it8")

@@ -36,7 +36,8 @@ def test_each_colour_space_reads_as_a_float_array(write_chart, fields, rows, att
     np.testing.assert_array_equal(values, expected)
     assert not chart.derived[attribute].any()
     assert chart.device == device
-    np.testing.assert_array_equal(chart.sample_ids, [1, 2])
+    assert chart.sample_ids.tolist() == ["1", "2"]
+    np.testing.assert_array_equal(chart.sample_numbers, [1, 2])
     # Spaces nothing here derives are NaN throughout, in their full shape.
     for other, channels in (("cmyk", 4), ("density", 4)):
         if other != attribute:
@@ -118,8 +119,14 @@ def test_bytes_that_are_not_utf8_survive_as_surrogates(write_chart):
 def test_example_chart_matches_the_tool(swatchlog):
     chart = redavudeva.read(EXAMPLES / "press_proof.it8")
     shown = swatchlog("patches", EXAMPLES / "press_proof.it8", "--spaces", "cmyk,lab", "--format", "tsv")
-    rows = [line.split("\t") for line in shown.stdout.splitlines()[1:]]
+    header, *rows = [line.split("\t") for line in shown.stdout.splitlines()]
+    column = {name.split(" ")[0]: i for i, name in enumerate(header)}
+
+    def cells(*names):
+        return [[float(row[column[name]]) for name in names] for row in rows]
+
     assert len(rows) == len(chart) == 48
-    np.testing.assert_allclose(chart.cmyk, [[float(v) for v in row[2:6]] for row in rows], atol=0.005)
-    np.testing.assert_allclose(chart.lab, [[float(v) for v in row[6:9]] for row in rows], atol=0.005)
-    assert chart.names == [row[1] for row in rows]
+    np.testing.assert_allclose(chart.cmyk, cells("CMYK_C", "CMYK_M", "CMYK_Y", "CMYK_K"), atol=0.005)
+    np.testing.assert_allclose(chart.lab, cells("LAB_L", "LAB_A", "LAB_B"), atol=0.005)
+    assert chart.names == [row[column["NAME"]] for row in rows]
+    assert chart.sample_ids.tolist() == [row[column["SAMPLE_ID"]] for row in rows]

@@ -32,7 +32,7 @@ ensure_packages() {
 }
 
 # Packages every build needs (the presets that test build the Python module).
-BUILD_PACKAGES=(cmake ninja-build g++ clang libgtest-dev libbenchmark-dev liblcms2-dev pkg-config jq python3
+BUILD_PACKAGES=(cmake ninja-build g++ clang libgtest-dev libbenchmark-dev liblcms2-dev pkg-config jq python3 acl
     argyll-ref colord-data pybind11-dev python3-dev python3-numpy python3-pytest)
 
 # Packages of installing the Python package with pip into a virtual environment.

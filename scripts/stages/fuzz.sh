@@ -1,9 +1,15 @@
 #!/usr/bin/env bash
 # Fuzzing stage: builds the libFuzzer targets with Clang under AddressSanitizer
 # and UndefinedBehaviorSanitizer, replays every saved crash input, then fuzzes
-# each target for a bounded time (REDAVUDEVA_FUZZ_SECONDS, default 60) starting
-# from its seed corpus, the example and test charts, and the chart files of the
-# installed Debian packages.
+# each target for a bounded time starting from its seed corpus, the example and
+# test charts, and the chart files of the installed Debian packages.
+#
+#   scripts/stages/fuzz.sh [SECONDS]   seconds per target (default
+#                                      REDAVUDEVA_FUZZ_SECONDS, else 60)
+#
+# Inputs may be up to 256 KiB, enough for a chart whose field names would need
+# gigabytes if the reader copied them without bound, and a run may use at most
+# 2 GiB of memory.
 # Fails on any crash, leak, per-input timeout or sanitizer report; the inputs
 # that failed are kept in build/fuzz/artifacts/ and printed in base64.
 set -euo pipefail
@@ -11,7 +17,13 @@ cd "$(dirname "$0")/../.."
 source scripts/lib/common.sh
 
 ensure_packages cmake ninja-build clang libclang-rt-14-dev argyll-ref colord-data
-seconds="${REDAVUDEVA_FUZZ_SECONDS:-60}"
+seconds="${1:-${REDAVUDEVA_FUZZ_SECONDS:-60}}"
+case "$seconds" in
+'' | *[!0-9]*)
+    echo "usage: $0 [SECONDS per target]" >&2
+    exit 2
+    ;;
+esac
 
 cmake --preset fuzz >/dev/null
 cmake --build --preset fuzz -j "$(nproc)" --target fuzz_targets
@@ -47,7 +59,7 @@ for target in fuzz_read_chart fuzz_source_writers fuzz_tokens; do
     regressions=(fuzz/regressions/"$name"/*)
     if [ -e "${regressions[0]}" ]; then
         echo "replaying ${#regressions[@]} saved crash input(s)"
-        if ! "$binary" -timeout=10 "${regressions[@]}"; then
+        if ! "$binary" -timeout=10 -rss_limit_mb=2048 "${regressions[@]}"; then
             failed+=("$name (regression)")
             continue
         fi
@@ -58,7 +70,7 @@ for target in fuzz_read_chart fuzz_source_writers fuzz_tokens; do
         seeds+=("$work/seeds")
     fi
     mkdir -p "$work/$name"
-    if ! "$binary" -max_total_time="$seconds" -timeout=10 -rss_limit_mb=2048 -max_len=8192 \
+    if ! "$binary" -max_total_time="$seconds" -timeout=10 -rss_limit_mb=2048 -max_len=262144 \
         -print_final_stats=1 -artifact_prefix="$artifacts/$name-" \
         "$work/$name" "${seeds[@]}"; then
         failed+=("$name")

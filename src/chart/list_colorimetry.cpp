@@ -1,29 +1,43 @@
 // Spectra handed in by the host, and the XYZ, L*a*b* and densities the colour
 // engine computes from them.
-#include <algorithm>
+#include <optional>
+#include <utility>
 
 #include "chart/spectral_field_name.h"
 #include "huekit.h"
+#include "patch/engine_spectrum.h"
 #include "patch/text_number.h"
 #include "redavudeva/swatchlog_base.h"
 
 namespace {
 
-// Fills `buffer` with the spectrum's values in field-name order. Positions the
-// spectrum does not reach read as 0; values beyond the buffer are not passed.
-void FillValueBuffer(const std::map<std::string, double>& spectrum, std::vector<float>& buffer) {
-    std::fill(buffer.begin(), buffer.end(), 0.0f);
-    std::size_t position = 0;
-    for (const auto& field : spectrum) {
-        if (position == buffer.size()) {
-            break;
+// One spectrum on the engine's grid, each value placed at the wavelength its own
+// field name gives. Nothing when a name carries no readable wavelength or the
+// spectrum cannot give colour.
+std::optional<engine_spectrum::EngineSpectrum>
+OnEngineGrid(const std::map<std::string, double>& spectrum) {
+    std::vector<engine_spectrum::Sample> samples;
+    samples.reserve(spectrum.size());
+    for (const auto& [name, value] : spectrum) {
+        const auto text = spectral_field_name::WavelengthText(name);
+        const std::optional<int> nm = text ? text_number::ReadInt(*text) : std::nullopt;
+        if (!nm) {
+            return std::nullopt;
         }
-        buffer[position++] = static_cast<float>(field.second);
+        samples.push_back(engine_spectrum::Sample{*nm, value});
     }
+    engine_spectrum::EngineSpectrum result;
+    if (!engine_spectrum::Resample(std::move(samples), result)) {
+        return std::nullopt;
+    }
+    return result;
 }
 
 } // namespace
 
+// Each spectrum is taken on its own wavelengths: 10 nm values within 380..780 nm
+// go to the engine unchanged, any other grid or range is resampled first, and a
+// spectrum that cannot give colour is skipped like one the engine refuses.
 void CSwatchlogBase::SetSpectralDataList(const std::vector<std::map<std::string, double>>& list,
                                          bool compute) {
     spectralList = list;
@@ -33,27 +47,12 @@ void CSwatchlogBase::SetSpectralDataList(const std::vector<std::map<std::string,
     xyzList.clear();
     labList.clear();
     densityList.clear();
-    if (list.empty() || list.front().empty()) {
-        return;
-    }
-    // Every spectrum is taken on the grid of the first one.
-    const auto wavelengthText = spectral_field_name::WavelengthText(list.front().begin()->first);
-    if (!wavelengthText) {
-        return;
-    }
-    const int startNm = text_number::ParseIntLenient(*wavelengthText);
-    const std::size_t valueCount = list.front().size();
-    const int engineCount = static_cast<int>(valueCount);
-    std::vector<float> values(valueCount);
-
     for (const auto& spectrum : list) {
-        FillValueBuffer(spectrum, values);
-
-        float engineXyz[3] = {};
-        if (HUEKIT_fromSpectralToCIEXYZ(values.data(), startNm, engineCount, engineXyz) != 0) {
+        const auto onGrid = OnEngineGrid(spectrum);
+        tagXYZ xyz;
+        if (!onGrid || !engine_spectrum::ToXYZ(*onGrid, xyz)) {
             continue;
         }
-        const tagXYZ xyz{engineXyz[0], engineXyz[1], engineXyz[2]};
         // The Lab conversion takes XYZ with white at Y = 1.
         const float scaledXyz[3] = {static_cast<float>(xyz.x / 100.0),
                                     static_cast<float>(xyz.y / 100.0),
@@ -62,14 +61,12 @@ void CSwatchlogBase::SetSpectralDataList(const std::vector<std::map<std::string,
         if (HUEKIT_fromCIEXYZToCIELAB(scaledXyz, engineLab) != 0) {
             continue;
         }
-        float engineDensity[4] = {};
-        if (HUEKIT_fromSpectralToDensity(values.data(), startNm, engineCount, engineDensity, 0) !=
-            0) {
+        tagDENSITY density; // majorFilter stays 0.0
+        if (!engine_spectrum::ToDensities(*onGrid, density)) {
             continue;
         }
         xyzList.push_back(xyz);
         labList.push_back(tagLAB{engineLab[0], engineLab[1], engineLab[2]});
-        densityList.push_back(tagDENSITY{engineDensity[0], engineDensity[1], engineDensity[2],
-                                         engineDensity[3], 0.0});
+        densityList.push_back(density);
     }
 }

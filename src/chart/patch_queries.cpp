@@ -6,11 +6,22 @@ namespace {
 
 using PatchMap = std::map<int, CColorPatch>;
 
+// The patch's getter of one record, and the presence test of that record
+// (none for the five-colour record, which no patch flags).
+template <typename Record> using RecordGetter = Record (CColorPatch::*)() const;
+using PresenceTest = bool (CColorPatch::*)() const;
+
+bool Holds(const CColorPatch& patch, PresenceTest holds) {
+    return holds == nullptr || (patch.*holds)();
+}
+
 // One patch's record, checked in the order: no patches (11), colour space not
-// carried (12), no such sample (10). The out-parameter changes only on success.
-template <typename Record, typename Getter>
+// carried by the chart (12), no such sample (10), colour space not held by that
+// patch (12: a spectrum that gave no colour, say). The out-parameter changes only
+// on success.
+template <typename Record>
 int GetPatchRecord(const PatchMap& patches, bool present, int sampleNumber, Record& out,
-                   Getter getter) {
+                   RecordGetter<Record> get, PresenceTest holds) {
     if (patches.empty()) {
         return 11;
     }
@@ -21,25 +32,34 @@ int GetPatchRecord(const PatchMap& patches, bool present, int sampleNumber, Reco
     if (found == patches.end()) {
         return 10;
     }
-    out = getter(found->second);
+    if (!Holds(found->second, holds)) {
+        return 12;
+    }
+    out = (found->second.*get)();
     return 0;
 }
 
 // Every patch's record in ascending sample number: 11 without patches, 12 when
-// the chart does not carry the colour space (list untouched in both cases).
-template <typename Record, typename Getter>
+// the chart does not carry the colour space or one of its patches does not hold
+// it (the list is untouched in these cases).
+template <typename Record>
 int CollectRecords(const PatchMap& patches, bool present, std::vector<Record>& list,
-                   Getter getter) {
+                   RecordGetter<Record> get, PresenceTest holds) {
     if (patches.empty()) {
         return 11;
     }
     if (!present) {
         return 12;
     }
+    for (const auto& entry : patches) {
+        if (!Holds(entry.second, holds)) {
+            return 12;
+        }
+    }
     list.clear();
     list.reserve(patches.size());
     for (const auto& entry : patches) {
-        list.push_back(getter(entry.second));
+        list.push_back((entry.second.*get)());
     }
     return 0;
 }
@@ -74,91 +94,97 @@ std::vector<CColorPatch> CSwatchlogBase::GetPatchList() {
 }
 
 int CSwatchlogBase::GetPatchCMYK(int sampleNumber, tagCMYK& cmyk) {
-    return GetPatchRecord(patches, hasCMYK, sampleNumber, cmyk,
-                          [](const CColorPatch& p) { return p.GetCMYK(); });
+    return GetPatchRecord(patches, hasCMYK, sampleNumber, cmyk, &CColorPatch::GetCMYK,
+                          &CColorPatch::IsCMYKPresent);
 }
 
 int CSwatchlogBase::GetPatchCMYKOG(int sampleNumber, tagCMYKOG& cmykog) {
-    return GetPatchRecord(patches, hasCMYKOG, sampleNumber, cmykog,
-                          [](const CColorPatch& p) { return p.GetCMYKOG(); });
+    return GetPatchRecord(patches, hasCMYKOG, sampleNumber, cmykog, &CColorPatch::GetCMYKOG,
+                          &CColorPatch::IsCMYKOGPresent);
 }
 
 int CSwatchlogBase::GetPatchCMYKRGB(int sampleNumber, tagCMYKRGB& cmykrgb) {
-    return GetPatchRecord(patches, hasCMYKRGB, sampleNumber, cmykrgb,
-                          [](const CColorPatch& p) { return p.GetCMYKRGB(); });
+    return GetPatchRecord(patches, hasCMYKRGB, sampleNumber, cmykrgb, &CColorPatch::GetCMYKRGB,
+                          &CColorPatch::IsCMYKRGBPresent);
 }
 
 int CSwatchlogBase::GetPatchXYZ(int sampleNumber, tagXYZ& xyz) {
-    return GetPatchRecord(patches, hasXYZ, sampleNumber, xyz,
-                          [](const CColorPatch& p) { return p.GetXYZ(); });
+    return GetPatchRecord(patches, hasXYZ, sampleNumber, xyz, &CColorPatch::GetXYZ,
+                          &CColorPatch::IsXYZPresent);
 }
 
 int CSwatchlogBase::GetPatchLAB(int sampleNumber, tagLAB& lab) {
-    return GetPatchRecord(patches, hasLAB, sampleNumber, lab,
-                          [](const CColorPatch& p) { return p.GetLAB(); });
+    return GetPatchRecord(patches, hasLAB, sampleNumber, lab, &CColorPatch::GetLAB,
+                          &CColorPatch::IsLABPresent);
 }
 
 int CSwatchlogBase::GetPatchRGB(int sampleNumber, tagRGB& rgb) {
-    return GetPatchRecord(patches, hasRGB, sampleNumber, rgb,
-                          [](const CColorPatch& p) { return p.GetRGB(); });
+    return GetPatchRecord(patches, hasRGB, sampleNumber, rgb, &CColorPatch::GetRGB,
+                          &CColorPatch::IsRGBPresent);
 }
 
 int CSwatchlogBase::GetPatchDensity(int sampleNumber, tagDENSITY& density) {
-    return GetPatchRecord(patches, hasDensity, sampleNumber, density,
-                          [](const CColorPatch& p) { return p.GetDensity(); });
+    return GetPatchRecord(patches, hasDensity, sampleNumber, density, &CColorPatch::GetDensity,
+                          &CColorPatch::IsDensityAvailable);
 }
 
 int CSwatchlogBase::CollectCMYK(std::vector<tagCMYK>& list) {
-    return CollectRecords(patches, hasCMYK, list, [](const CColorPatch& p) { return p.GetCMYK(); });
+    return CollectRecords(patches, hasCMYK, list, &CColorPatch::GetCMYK,
+                          &CColorPatch::IsCMYKPresent);
 }
 
 int CSwatchlogBase::CollectCMYKOG(std::vector<tagCMYKOG>& list) {
-    return CollectRecords(patches, hasCMYKOG, list,
-                          [](const CColorPatch& p) { return p.GetCMYKOG(); });
+    return CollectRecords(patches, hasCMYKOG, list, &CColorPatch::GetCMYKOG,
+                          &CColorPatch::IsCMYKOGPresent);
 }
 
 int CSwatchlogBase::CollectCMYKO(std::vector<SWL_CMYKO>& list) {
-    return CollectRecords(patches, hasCMYKO, list,
-                          [](const CColorPatch& p) { return p.GetCMYKO(); });
+    return CollectRecords(patches, hasCMYKO, list, &CColorPatch::GetCMYKO, nullptr);
 }
 
 int CSwatchlogBase::CollectCMYKOGV(std::vector<tagCMYKOGV>& list) {
-    return CollectRecords(patches, hasCMYKOGV, list,
-                          [](const CColorPatch& p) { return p.GetCMYKOGV(); });
+    return CollectRecords(patches, hasCMYKOGV, list, &CColorPatch::GetCMYKOGV,
+                          &CColorPatch::IsCMYKOGVPresent);
 }
 
 int CSwatchlogBase::CollectCMYKRGB(std::vector<tagCMYKRGB>& list) {
-    return CollectRecords(patches, hasCMYKRGB, list,
-                          [](const CColorPatch& p) { return p.GetCMYKRGB(); });
+    return CollectRecords(patches, hasCMYKRGB, list, &CColorPatch::GetCMYKRGB,
+                          &CColorPatch::IsCMYKRGBPresent);
 }
 
 int CSwatchlogBase::CollectXYZ(std::vector<tagXYZ>& list) {
-    return CollectRecords(patches, hasXYZ, list, [](const CColorPatch& p) { return p.GetXYZ(); });
+    return CollectRecords(patches, hasXYZ, list, &CColorPatch::GetXYZ, &CColorPatch::IsXYZPresent);
 }
 
 int CSwatchlogBase::CollectLAB(std::vector<tagLAB>& list) {
-    return CollectRecords(patches, hasLAB, list, [](const CColorPatch& p) { return p.GetLAB(); });
+    return CollectRecords(patches, hasLAB, list, &CColorPatch::GetLAB, &CColorPatch::IsLABPresent);
 }
 
 int CSwatchlogBase::CollectRGB(std::vector<tagRGB>& list) {
-    return CollectRecords(patches, hasRGB, list, [](const CColorPatch& p) { return p.GetRGB(); });
+    return CollectRecords(patches, hasRGB, list, &CColorPatch::GetRGB, &CColorPatch::IsRGBPresent);
 }
 
 int CSwatchlogBase::CollectHTMLCOLOR(std::vector<tagHTMLCOLOR>& list) {
-    return CollectRecords(patches, hasHTMLCOLOR, list,
-                          [](const CColorPatch& p) { return p.GetHTMLCOLOR(); });
+    return CollectRecords(patches, hasHTMLCOLOR, list, &CColorPatch::GetHTMLCOLOR,
+                          &CColorPatch::IsHTMLCOLORPresent);
 }
 
 // Densities are held per patch, so they are collected like every other record.
 int CSwatchlogBase::CollectDensities(std::vector<tagDENSITY>& list) {
-    return CollectRecords(patches, hasDensity, list,
-                          [](const CColorPatch& p) { return p.GetDensity(); });
+    return CollectRecords(patches, hasDensity, list, &CColorPatch::GetDensity,
+                          &CColorPatch::IsDensityAvailable);
 }
 
-// Only the flag is tested: an n-colour chart without patches answers an empty list.
+// No test for an empty store: an n-colour chart without patches answers an
+// empty list. A patch without n-colour channels answers 12, as for the records.
 int CSwatchlogBase::CollectNColorMaps(std::vector<std::map<int, tagNCLR>>& list) {
     if (!hasNColor) {
         return 12;
+    }
+    for (const auto& entry : patches) {
+        if (!entry.second.IsNColorPresent()) {
+            return 12;
+        }
     }
     list.clear();
     list.reserve(patches.size());

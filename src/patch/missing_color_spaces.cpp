@@ -1,4 +1,5 @@
 // CColorPatch: marking the colour spaces a data row supplied and deriving the rest.
+#include "patch/engine_spectrum.h"
 #include "redavudeva/color_patch.h"
 
 namespace {
@@ -21,11 +22,21 @@ constexpr unsigned int kDefaultRgbConversion = 0;
 void CColorPatch::SetMissingColorSpace(std::uint32_t mask) {
     m_missingMask = mask;
 
+    // The spectrum on the colour engine's grid, worked out once for the steps
+    // that derive from it. A spectrum that cannot give colour (one value, a
+    // non-finite value, nothing within 380..780 nm, an unreadable name) derives
+    // nothing at all.
+    engine_spectrum::EngineSpectrum spectrum;
+    const bool spectrumUsable =
+        m_bSpectral && (mask & (MISSING_CMYK | MISSING_XYZ | MISSING_DENSITY)) != 0 &&
+        engine_spectrum::FromPatchSpectrum(m_spectralData, m_spectral, m_bSpectralOnEngineGrid,
+                                           spectrum);
+
     // CMYK (holding red, green, blue and visual density) from the spectrum; an
     // off-grid spectrum still counts, its record then reads -1, 0, 0, 0.
     if (!IsMissing(mask, MISSING_CMYK)) {
         m_bCMYK = true;
-    } else if (m_bSpectral) {
+    } else if (spectrumUsable) {
         m_CMYK = GetCMYKfromSPECTRAL(kDefaultDensityFilterSet, m_spectral);
         m_bCMYK = true;
     }
@@ -33,7 +44,7 @@ void CColorPatch::SetMissingColorSpace(std::uint32_t mask) {
     if (!IsMissing(mask, MISSING_XYZ)) {
         m_bXYZ = true;
     } else if (m_bSpectral) {
-        m_bXYZ = calculateXYZ();
+        m_bXYZ = spectrumUsable && engine_spectrum::ToXYZ(spectrum, m_XYZ);
     }
 
     if (!IsMissing(mask, MISSING_LAB)) {
@@ -57,7 +68,9 @@ void CColorPatch::SetMissingColorSpace(std::uint32_t mask) {
         // The components are clamped to 0..255, so they fit an int.
         m_RGB = tagRGB{static_cast<int>(r), static_cast<int>(g), static_cast<int>(b)};
         m_bRGB = true;
-    } else if (m_bCMYK) {
+    } else if (m_bCMYK && !IsMissing(mask, MISSING_CMYK)) {
+        // Only CMYK the row supplied is a device value; CMYK derived from the
+        // spectrum holds densities or the off-grid marker.
         m_RGB = GetRGBFromCMYK(m_CMYK);
         m_bRGB = true;
     }
@@ -84,6 +97,6 @@ void CColorPatch::SetMissingColorSpace(std::uint32_t mask) {
     if (!IsMissing(mask, MISSING_DENSITY)) {
         m_bDensity = true;
     } else if (m_bSpectral) {
-        m_bDensity = calculateDensities();
+        m_bDensity = spectrumUsable && engine_spectrum::ToDensities(spectrum, m_density);
     }
 }

@@ -1,31 +1,40 @@
 // CColorPatch: tristimulus values from a spectrum (built-in tables or the colour
 // engine) and XYZ from Lab through the colour engine.
-#include <array>
 #include <cstddef>
 
 #include "huekit.h"
 #include "patch/colorimetry_tables.h"
+#include "patch/engine_spectrum.h"
 #include "redavudeva/color_patch.h"
 
-namespace {
+namespace engine_spectrum {
 
-// The largest spectrum a patch holds (SpectralDataStruct::values).
-constexpr int kMaxSpectralValues = 50;
-
-// The patch's spectrum as single-precision floats for the colour engine.
-// Answers false for a count the spectrum record cannot hold.
-bool ToEngineSpectrum(const SpectralDataStruct& spectral,
-                      std::array<float, kMaxSpectralValues>& buffer) {
-    if (spectral.count < 1 || spectral.count > kMaxSpectralValues) {
+bool ToXYZ(const EngineSpectrum& spectrum, tagXYZ& xyz) {
+    float out[3] = {};
+    if (HUEKIT_fromSpectralToCIEXYZ(spectrum.values.data(), spectrum.startNm, spectrum.count,
+                                    out) != 0) {
         return false;
     }
-    for (int i = 0; i < spectral.count; ++i) {
-        buffer[static_cast<std::size_t>(i)] = static_cast<float>(spectral.values[i]);
-    }
+    xyz.x = out[0];
+    xyz.y = out[1];
+    xyz.z = out[2];
     return true;
 }
 
-} // namespace
+bool ToDensities(const EngineSpectrum& spectrum, tagDENSITY& density) {
+    float out[4] = {};
+    if (HUEKIT_fromSpectralToDensity(spectrum.values.data(), spectrum.startNm, spectrum.count, out,
+                                     0) != 0) {
+        return false;
+    }
+    density.red = out[0];
+    density.green = out[1];
+    density.blue = out[2];
+    density.visual = out[3];
+    return true;
+}
+
+} // namespace engine_spectrum
 
 void CColorPatch::getXYZ(double* xyzOut, const double* spectrum, int type) {
     const colorimetry::WeightingSet* set = colorimetry::WeightingSetForType(type);
@@ -49,37 +58,20 @@ void CColorPatch::computeNormWeighting() {
     }
 }
 
+// The spectrum goes to the engine on its 10 nm grid (see engine_spectrum.h);
+// one that cannot give colour derives nothing.
 bool CColorPatch::calculateXYZ() {
-    std::array<float, kMaxSpectralValues> spectrum{};
-    if (!ToEngineSpectrum(m_spectral, spectrum)) {
-        return false;
-    }
-    float xyz[3] = {};
-    if (HUEKIT_fromSpectralToCIEXYZ(spectrum.data(), m_spectral.startNm, m_spectral.count, xyz) !=
-        0) {
-        return false;
-    }
-    m_XYZ.x = xyz[0];
-    m_XYZ.y = xyz[1];
-    m_XYZ.z = xyz[2];
-    return true;
+    engine_spectrum::EngineSpectrum spectrum;
+    return engine_spectrum::FromPatchSpectrum(m_spectralData, m_spectral, m_bSpectralOnEngineGrid,
+                                              spectrum) &&
+           engine_spectrum::ToXYZ(spectrum, m_XYZ);
 }
 
 bool CColorPatch::calculateDensities() {
-    std::array<float, kMaxSpectralValues> spectrum{};
-    if (!ToEngineSpectrum(m_spectral, spectrum)) {
-        return false;
-    }
-    float density[4] = {};
-    if (HUEKIT_fromSpectralToDensity(spectrum.data(), m_spectral.startNm, m_spectral.count, density,
-                                     0) != 0) {
-        return false;
-    }
-    m_density.red = density[0];
-    m_density.green = density[1];
-    m_density.blue = density[2];
-    m_density.visual = density[3];
-    return true;
+    engine_spectrum::EngineSpectrum spectrum;
+    return engine_spectrum::FromPatchSpectrum(m_spectralData, m_spectral, m_bSpectralOnEngineGrid,
+                                              spectrum) &&
+           engine_spectrum::ToDensities(spectrum, m_density);
 }
 
 bool CColorPatch::convertLabToXYZ() {

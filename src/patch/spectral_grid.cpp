@@ -1,38 +1,38 @@
 // CColorPatch: laying the spectral map out on its wavelength grid.
-#include <array>
 #include <cstddef>
 #include <cstdint>
 #include <limits>
 #include <stdexcept>
 #include <string>
+#include <string_view>
 
+#include "patch/engine_spectrum.h"
+#include "patch/field_wavelength.h"
 #include "patch/text_number.h"
 #include "redavudeva/color_patch.h"
 
 namespace {
 
-// Lead-ins and trailers that surround the wavelength in a spectral field name,
-// tried in this order ("SPECTRAL_NM_380", "SPECTRAL_380", "380NM").
-constexpr std::array<const char*, 3> kWavelengthMarkers{"SPECTRAL_NM_", "SPECTRAL_", "NM"};
-
 constexpr std::size_t kGridCapacity = sizeof(SpectralDataStruct::values) / sizeof(double);
 
 // The first marker that occurs anywhere in `key`; out_of_range when none does.
-std::string ChooseMarker(const std::string& key) {
-    for (const char* marker : kWavelengthMarkers) {
-        if (key.find(marker) != std::string::npos) {
-            return marker;
-        }
+const char* ChooseMarker(const std::string& key) {
+    const char* marker = field_wavelength::MarkerIn(key);
+    if (marker == nullptr) {
+        throw std::out_of_range("invalid string position");
     }
-    throw std::out_of_range("invalid string position");
+    return marker;
 }
 
 // The wavelength named by `key`: the key with the first occurrence of `marker`
 // removed, read as a decimal integer. Throws out_of_range("invalid string
 // position") when the marker is absent, and the number reader's invalid_argument
 // or out_of_range when no digits follow or the number is too large.
-int WavelengthOf(const std::string& key, const std::string& marker) {
-    const std::size_t at = key.find(marker);
+int WavelengthOf(const std::string& key, std::string_view marker) {
+    if (const auto nm = field_wavelength::WavelengthIn(key, marker)) {
+        return *nm;
+    }
+    const std::size_t at = key.find(marker.data(), 0, marker.size());
     if (at == std::string::npos) {
         throw std::out_of_range("invalid string position");
     }
@@ -70,19 +70,22 @@ void CColorPatch::SetSpectralDataStruct() {
     SpectralDataStruct grid;
     const std::string* leastKey = nullptr;
     const std::string* greatestKey = nullptr;
+    // In the same walk: can the values go to the engine as they are?
+    engine_spectrum::NameWatch names(m_spectralData.begin()->first);
     for (const auto& entry : m_spectralData) {
         if (static_cast<std::size_t>(grid.count) == kGridCapacity) {
             break;
         }
         grid.values[grid.count] = entry.second;
         ++grid.count;
+        names.See(entry.first);
         if (leastKey == nullptr) {
             leastKey = &entry.first;
         }
         greatestKey = &entry.first;
     }
 
-    const std::string marker = ChooseMarker(*greatestKey);
+    const char* marker = ChooseMarker(*greatestKey);
     const int greatestNm = WavelengthOf(*greatestKey, marker);
     const int leastNm = WavelengthOf(*leastKey, marker);
     grid.startNm = leastNm;
@@ -90,4 +93,7 @@ void CColorPatch::SetSpectralDataStruct() {
 
     m_spectral = grid;
     m_bSpectral = true;
+    m_bSpectralOnEngineGrid =
+        static_cast<std::size_t>(grid.count) == m_spectralData.size() &&
+        names.OnEngineGrid(*leastKey, *greatestKey, marker, grid.values, grid.count);
 }

@@ -19,7 +19,7 @@ bool IsSpace(char c) {
 
 // Scans white space, sign and digits; stops accumulating once the value leaves
 // the 32-bit range so that long digit runs cannot overflow.
-Scan ScanInteger(const std::string& text) {
+Scan ScanInteger(std::string_view text) {
     Scan scan;
     std::size_t i = 0;
     while (i < text.size() && IsSpace(text[i])) {
@@ -39,7 +39,8 @@ Scan ScanInteger(const std::string& text) {
         }
     }
     const std::int64_t value = negative ? -magnitude : magnitude;
-    scan.overflow = value > std::numeric_limits<int>::max() || value < std::numeric_limits<int>::min();
+    scan.overflow =
+        value > std::numeric_limits<int>::max() || value < std::numeric_limits<int>::min();
     scan.value = value;
     return scan;
 }
@@ -64,6 +65,14 @@ int ParseIntLenient(const std::string& text) {
     }
     if (scan.value < std::numeric_limits<int>::min()) {
         return std::numeric_limits<int>::min();
+    }
+    return static_cast<int>(scan.value);
+}
+
+std::optional<int> ReadInt(std::string_view text) {
+    const Scan scan = ScanInteger(text);
+    if (!scan.hasDigits || scan.overflow) {
+        return std::nullopt;
     }
     return static_cast<int>(scan.value);
 }

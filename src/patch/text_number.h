@@ -1,7 +1,9 @@
 // Whole numbers in header values and spectral field names.
 #pragma once
 
+#include <optional>
 #include <string>
+#include <string_view>
 
 namespace text_number {
 
@@ -15,5 +17,9 @@ int ParseLongStrict(const std::string& text);
 /// The same reading, but a text without digits gives 0 and a value outside the
 /// signed 32-bit range is clamped to it. Never throws.
 int ParseIntLenient(const std::string& text);
+
+/// The same reading without exceptions: nothing when no digit follows or the
+/// value lies outside the signed 32-bit range.
+std::optional<int> ReadInt(std::string_view text);
 
 } // namespace text_number

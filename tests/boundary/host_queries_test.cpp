@@ -100,6 +100,35 @@ TEST_F(HostQueries, RecordByNumberTestsEmptyStoreThenSpaceThenNumber) {
     EXPECT_EQ(result, 0);
 }
 
+TEST_F(HostQueries, APatchWhoseSpectrumGaveNoColourAnswers12) {
+    // 10 nm from 360 to 780 nm; patch 1 reflects 0.5 everywhere, patch 2 has
+    // "nan" at 500 nm. One patch per strip.
+    std::string fields = "SAMPLE_ID", flat = "1", broken = "2";
+    for (int nm = 360; nm <= 780; nm += 10) {
+        fields += " SPECTRAL_NM_" + std::to_string(nm);
+        flat += " 0.5";
+        broken += nm == 500 ? " nan" : " 0.5";
+    }
+    ASSERT_EQ(Read(fields, {flat, broken}, {"NUMBER_OF_STRIPS\t2", "NUMBER_OF_COLS\t1"}), 0);
+    // The engine's perfect white has Y = 100, so a flat 0.5 gives Y = 50 and
+    // L* = 116 * 0.5^(1/3) - 16 = 76.0693.
+    tagLAB lab{1, 2, 3};
+    tagCMYK cmyk;
+    tagXYZ xyz;
+    EXPECT_EQ((std::vector<int>{host->GetPatchLAB(2, lab), host->GetPatchXYZ(2, xyz),
+                                host->GetPatchCMYK(2, cmyk)}),
+              (std::vector<int>{12, 12, 12}));
+    EXPECT_EQ(Values(lab), (std::vector<double>{1, 2, 3}));
+    ASSERT_EQ(host->GetPatchLAB(1, lab), 0);
+    EXPECT_NEAR(lab.l, 76.0693, 1e-4);
+    std::vector<tagLAB> labs{tagLAB{1, 2, 3}};
+    EXPECT_EQ(host->CollectLAB(labs), 12); // not a zero record for patch 2
+    EXPECT_EQ(ValueRows(labs), (Rows{{1, 2, 3}}));
+    EXPECT_EQ((std::vector<int>{host->CollectStripLAB(1, labs), host->CollectStripLAB(2, labs)}),
+              (std::vector<int>{0, 12}));
+    EXPECT_TRUE(host->IsColorSpacePresent(COLORSPACE_LAB)); // the chart as a whole carries it
+}
+
 TEST_F(HostQueries, DensitiesPerPatchInSampleOrder) {
     std::vector<tagDENSITY> densities{tagDENSITY{}};
     EXPECT_EQ(host->CollectDensities(densities), 11);

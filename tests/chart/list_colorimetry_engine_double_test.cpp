@@ -52,22 +52,27 @@ TEST_F(ListColorimetry, TwoSpectraGiveTwoEntriesThroughThreeCallsEach) {
         (std::vector<double>{42.0, 3.5, 0.5, 0.25, 1.5, 2.0, 0.0}));
 }
 
-TEST_F(ListColorimetry, StartWavelengthFromTheFirstName) {
+TEST_F(ListColorimetry, EachSpectrumOnTheWavelengthsOfItsOwnNames) {
     for (const char* leadIn : {"nm", "NM"}) {
         engine_double::Reset();
         store.SetSpectralDataList(
             {Spectrum(leadIn, 400, 700, 10), Spectrum("SPECTRAL_", 380, 730, 10)}, true);
-        EXPECT_EQ(engine_double::Calls().at(3).startNm, 400); // the second on the first's grid
+        const auto& calls = engine_double::Calls();
+        ASSERT_EQ(calls.size(), 6u);
+        EXPECT_EQ(
+            (std::vector<int>{calls[0].startNm, calls[0].count, calls[3].startNm, calls[3].count}),
+            (std::vector<int>{400, 31, 380, 36}));
     }
+    // Names without a wavelength, without a lead-in, or no names at all: those
+    // spectra are skipped, the others computed.
     engine_double::Reset();
-    store.SetSpectralDataList({{{"SPECTRAL_x", 0.5}, {"SPECTRAL_y", 0.6}}}, true);
-    ASSERT_EQ(engine_double::Calls().size(), 3u); // no digit: start 0, still computed
-    EXPECT_EQ(engine_double::Calls()[0].startNm, 0);
-    engine_double::Reset();
-    for (const Spectra& list : {Spectra{{{"R380", 0.5}}}, Spectra{{}, {{"SPECTRAL_380", 0.5}}}}) {
-        store.SetSpectralDataList(list, true); // no lead-in, or an empty first spectrum
-        EXPECT_TRUE(engine_double::Calls().empty());
-    }
+    store.SetSpectralDataList({{{"SPECTRAL_x", 0.5}, {"SPECTRAL_y", 0.6}},
+                               {{"R380", 0.5}, {"R390", 0.5}},
+                               {},
+                               Spectrum("SPECTRAL_", 380, 730, 10)},
+                              true);
+    ASSERT_EQ(engine_double::Calls().size(), 3u);
+    EXPECT_EQ(ComputedSizes(), (std::vector<std::size_t>{1, 1, 1}));
 }
 
 TEST_F(ListColorimetry, AFailingSpectrumLeavesNoEntry) {
@@ -85,16 +90,20 @@ TEST_F(ListColorimetry, AFailingSpectrumLeavesNoEntry) {
     }
 }
 
-TEST_F(ListColorimetry, SpectraOfOtherLengthsUseTheFirstOnesCount) {
-    Spectra spectra{Spectrum("SPECTRAL_", 380, 430, 10, 0.5),   // 6 values
-                    Spectrum("SPECTRAL_", 380, 400, 10, 0.25),  // 3 values
-                    Spectrum("SPECTRAL_", 380, 730, 10, 0.75)}; // 36 values
+TEST_F(ListColorimetry, OtherGridsAndRangesAreBroughtOnto10nmSteps) {
+    Spectra spectra{Spectrum("SPECTRAL_", 380, 400, 10, 0.25),  // 3 values, as they are
+                    Spectrum("SPECTRAL_", 380, 780, 20, 0.5),   // every 20 nm
+                    Spectrum("SPECTRAL_", 360, 780, 10, 0.75)}; // from 360 nm
     store.SetSpectralDataList(spectra, true);
     const auto& calls = engine_double::Calls();
     ASSERT_EQ(calls.size(), 9u);
-    EXPECT_EQ(calls[6].count, 6);
-    EXPECT_EQ(calls[3].input, (std::vector<float>{0.25f, 0.25f, 0.25f, 0.0f, 0.0f, 0.0f}));
-    EXPECT_EQ(calls[6].input, std::vector<float>(6, 0.75f));
+    EXPECT_EQ(calls[0].input, std::vector<float>(3, 0.25f));
+    EXPECT_EQ(
+        (std::vector<int>{calls[3].startNm, calls[3].count, calls[6].startNm, calls[6].count}),
+        (std::vector<int>{380, 41, 380, 41}));
+    // A flat spectrum stays flat between its points.
+    EXPECT_EQ(calls[3].input, std::vector<float>(41, 0.5f));
+    EXPECT_EQ(calls[8].input, std::vector<float>(41, 0.75f));
 }
 
 } // namespace

@@ -1,42 +1,9 @@
 #include "chart_model.h"
 
 #include <algorithm>
-#include <exception>
-#include <filesystem>
-#include <fstream>
-#include <sstream>
-#include <system_error>
-
-#include "chart_scan.h"
-#include "file_paths.h"
-#include "result_messages.h"
-#include "tool_error.h"
-#include "utf8_text.h"
 
 namespace swatchlog {
 namespace {
-
-std::vector<std::string> SplitWords(const std::string& text) {
-    std::istringstream in(text);
-    std::vector<std::string> words;
-    std::string word;
-    while (in >> word) {
-        words.push_back(word);
-    }
-    return words;
-}
-
-std::string FirstWordOfFile(const std::string& path) {
-    std::ifstream in(FileSystemPath(path), std::ios::binary);
-    std::string line;
-    while (std::getline(in, line)) {
-        const auto words = SplitWords(line);
-        if (!words.empty()) {
-            return words[0];
-        }
-    }
-    return "";
-}
 
 std::string TrimRight(std::string text) {
     text.erase(text.find_last_not_of(" \t\r\n") + 1);
@@ -75,52 +42,22 @@ bool SpaceFromKey(const std::string& key, Space& space) {
     return false;
 }
 
-std::string DescribeLibraryException(const std::exception& error) {
-    const std::string what = error.what();
-    if (what == "invalid stol argument" || what == "stol argument out of range") {
-        return "a layout keyword (NUMBER_OF_STRIPS, NUMBER_OF_COLS) or a spectral field name "
-               "does not hold a usable whole number (" +
-               what + ")";
+Chart Chart::Load(const std::string& path, int table) {
+    Chart chart(LoadTable(path, table));
+    chart.patches_ = chart.Store().GetPatchList();
+    chart.sampleIds_ = chart.loaded_.ColumnText("SAMPLE_ID");
+    if (chart.sampleIds_.size() != chart.patches_.size()) {
+        chart.sampleIds_.clear();
     }
-    if (what == "invalid string position") {
-        return "the spectral field names do not follow one naming scheme (" + what + ")";
-    }
-    return "the library stopped with an error: " + what;
-}
-
-Chart Chart::Load(const std::string& path) {
-    Chart chart;
-    chart.path_ = path;
-    const std::wstring libraryPath = LibraryPath(path);
-    std::error_code ec;
-    if (std::filesystem::is_directory(FileSystemPath(path), ec)) {
-        throw ChartError(RepairUtf8(path) + ": is a folder, not a chart file", path, 0);
-    }
-    chart.store_.reset(CSwatchlogFactory::GetReaderWriter(CSwatchlogFactory::READERWRITER_IT8));
-    if (!chart.store_) {
-        throw ChartError("the library offers no chart reader");
-    }
-    int code = 0;
-    try {
-        code = chart.store_->ReadChartFile(libraryPath);
-    } catch (const std::exception& error) {
-        // The library's own exception stays attached, for callers that tell its kind apart.
-        std::throw_with_nested(
-            ChartError(RepairUtf8(path) + ": " + DescribeLibraryException(error), path, 0));
-    }
-    if (code != 0) {
-        throw ChartError(RepairUtf8(path) + ": " +
-                             WithCode(ExplainReadFailure(code, ScanChartFile(path)), code),
-                         path, code);
-    }
-    chart.fields_ = SplitWords(chart.store_->GetDataFormatLine());
-    chart.patches_ = chart.store_->GetPatchList();
-    chart.identification_ = FirstWordOfFile(path);
     return chart;
 }
 
+std::string Chart::SampleId(std::size_t index) const {
+    return index < sampleIds_.size() ? sampleIds_[index] : std::string();
+}
+
 bool Chart::FileHasField(const std::string& field) const {
-    return std::find(fields_.begin(), fields_.end(), field) != fields_.end();
+    return FieldColumn(loaded_.Text(), field) >= 0;
 }
 
 bool Chart::PatchHas(const CColorPatch& patch, Space space) {
@@ -156,28 +93,33 @@ bool Chart::Has(Space space) const {
                        [space](const CColorPatch& patch) { return PatchHas(patch, space); });
 }
 
-bool Chart::Derived(Space space) const {
-    if (!Has(space)) {
-        return false;
-    }
+const char* SupplyingField(Space space) {
     switch (space) {
+    case Space::Cmyk:
+        return "CMYK_C";
     case Space::Rgb:
-        return !FileHasField("RGB_R");
+        return "RGB_R";
     case Space::Xyz:
-        return !FileHasField("XYZ_X");
+        return "XYZ_X";
     case Space::Lab:
-        return !FileHasField("LAB_L");
+        return "LAB_L";
     case Space::Density:
-        return !FileHasField("D_RED");
+        return "D_RED";
     default:
-        return false;
+        return nullptr;
     }
 }
 
-KeywordList Chart::Keywords() const {
+bool Chart::Derived(Space space) const {
+    const char* field = SupplyingField(space);
+    return field != nullptr && Has(space) && !FileHasField(field);
+}
+
+KeywordList TableKeywords(const LoadedTable& table) {
     KeywordList keywords;
-    for (const auto& [key, value] : store_->GetKeywords()) {
-        if (key == identification_ || key.empty() || key[0] == '#' || key == "KEYWORD" ||
+    const std::string& identification = table.Table().identification;
+    for (const auto& [key, value] : table.Chart().GetKeywords()) {
+        if (key == identification || key.empty() || key[0] == '#' || key == "KEYWORD" ||
             key == "PROCESSCOLOR_ID") {
             continue;
         }

@@ -6,6 +6,7 @@
 #include "commands.h"
 #include "device_space.h"
 #include "json_writer.h"
+#include "result_messages.h"
 #include "text_table.h"
 #include "tool_error.h"
 #include "utf8_text.h"
@@ -13,11 +14,15 @@
 namespace swatchlog {
 
 const char* const kInfoHelp =
-    "Usage: swatchlog info CHART [--format text|json]\n\n"
+    "Usage: swatchlog info CHART [--table N] [--format text|json]\n\n"
     "Prints the chart's identification line, its keywords, NUMBER_OF_SETS and the\n"
     "number of patches read, the layout (strips, columns, pages), the colour spaces\n"
     "present and which of them the library derived, the device colour space and\n"
-    "channel count, the spectral range and the process colour names.\n";
+    "channel count, the spectral range and the process colour names.\n\n"
+    "A file that holds several tables (each with its own data format and data\n"
+    "block) has them listed with their lines, rows and fields; the details are\n"
+    "those of one table:\n"
+    "  --table N   the table to describe (default: the first with data rows)\n";
 
 namespace {
 
@@ -54,7 +59,7 @@ InfoFacts Gather(const Chart& chart) {
     try {
         facts.range = store.GetSpectralRange();
     } catch (const std::exception& error) {
-        throw ChartError(chart.Path() + ": " + DescribeLibraryException(error));
+        throw ChartError(chart.Name() + ": " + DescribeLibraryException(error));
     }
     if (store.GetProcessColorNames(facts.processColors) != 0) {
         facts.processColors.clear();
@@ -80,12 +85,51 @@ std::string LayoutText(const InfoFacts& facts) {
     return text;
 }
 
+std::string FieldList(const std::vector<std::string>& fields) {
+    std::string text;
+    for (const auto& field : fields) {
+        text += (text.empty() ? "" : " ") + field;
+    }
+    return text.empty() ? "(no data format)" : text;
+}
+
+// One line per table of a file of several: number, lines, identification, rows, fields.
+void PrintTables(const Chart& chart, std::ostream& out) {
+    const auto& tables = chart.Loaded().Tables();
+    out << "tables\n";
+    TextTable list;
+    for (const bool numeric : {true, false, false, true, false}) {
+        list.AddColumn("", numeric);
+    }
+    for (const auto& table : tables) {
+        list.AddRow(
+            {"  " + std::to_string(table.number),
+             "lines " + std::to_string(table.firstLine) + "-" + std::to_string(table.lastLine),
+             RepairUtf8(table.identification),
+             std::to_string(table.rowCount) + (table.rowCount == 1 ? " row" : " rows"),
+             RepairUtf8(FieldList(table.fields))});
+    }
+    std::ostringstream text;
+    list.Print(text, TableFormat::Table);
+    const std::string listed = text.str();
+    out << listed.substr(listed.find('\n') + 1);
+}
+
 void PrintText(const Chart& chart, const InfoFacts& facts, std::ostream& out) {
     TextTable table;
     table.AddColumn("", false);
     table.AddColumn("", false);
     table.AddRow({"file", RepairUtf8(chart.Path())});
-    table.AddRow({"identification", RepairUtf8(chart.Identification())});
+    const LoadedTable& loaded = chart.Loaded();
+    if (loaded.Tables().size() > 1) {
+        table.AddRow({"table", std::to_string(loaded.Table().number) + " of " +
+                                   std::to_string(loaded.Tables().size()) + ", lines " +
+                                   std::to_string(loaded.Table().firstLine) + "-" +
+                                   std::to_string(loaded.Table().lastLine) +
+                                   " (--table N shows another)"});
+    }
+    table.AddRow({"identification",
+                  chart.Identification().empty() ? "none" : RepairUtf8(chart.Identification())});
     table.AddRow({"patches", std::to_string(facts.patchCount) + " (NUMBER_OF_SETS " +
                                  RepairUtf8(facts.numberOfSets) + ")"});
     table.AddRow({"layout", LayoutText(facts)});
@@ -116,6 +160,9 @@ void PrintText(const Chart& chart, const InfoFacts& facts, std::ostream& out) {
     // The first line of the table is its empty header row.
     const std::string text = body.str();
     out << text.substr(text.find('\n') + 1);
+    if (chart.Loaded().Tables().size() > 1) {
+        PrintTables(chart, out);
+    }
     out << "keywords\n";
     TextTable keywords;
     keywords.AddColumn("", false);
@@ -136,6 +183,31 @@ void PrintJson(const Chart& chart, const InfoFacts& facts, std::ostream& out) {
     json.String(chart.Path());
     json.Key("identification");
     json.String(chart.Identification());
+    json.Key("table");
+    json.Integer(chart.Loaded().Table().number);
+    json.Key("tables");
+    json.BeginArray();
+    for (const auto& table : chart.Loaded().Tables()) {
+        json.BeginObject();
+        json.Key("number");
+        json.Integer(table.number);
+        json.Key("first_line");
+        json.Integer(table.firstLine);
+        json.Key("last_line");
+        json.Integer(table.lastLine);
+        json.Key("identification");
+        json.String(table.identification);
+        json.Key("rows");
+        json.Integer(table.rowCount);
+        json.Key("fields");
+        json.BeginArray(true);
+        for (const auto& field : table.fields) {
+            json.String(field);
+        }
+        json.EndArray();
+        json.EndObject();
+    }
+    json.EndArray();
     json.Key("patch_count");
     json.Integer(facts.patchCount);
     json.Key("number_of_sets");
@@ -203,10 +275,11 @@ void PrintJson(const Chart& chart, const InfoFacts& facts, std::ostream& out) {
 } // namespace
 
 int RunInfo(const Words& args, std::ostream& out, std::ostream& /*err*/) {
-    const ParsedArguments parsed = ParseArguments(args, {{"format", '\0', true}});
+    const ParsedArguments parsed =
+        ParseArguments(args, {{"format", '\0', true}, {"table", '\0', true}});
     RequirePositionals(parsed, 1, 1, "the chart file");
     const OutputFormat format = ParseFormat(parsed, {"text", "json"});
-    const Chart chart = Chart::Load(parsed.positionals[0]);
+    const Chart chart = Chart::Load(parsed.positionals[0], TableOption(parsed));
     const InfoFacts facts = Gather(chart);
     if (format.json) {
         PrintJson(chart, facts, out);

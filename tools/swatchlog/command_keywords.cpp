@@ -1,8 +1,12 @@
-// swatchlog keywords: keyword lines inserted after the identification line.
+// swatchlog keywords: header keywords set in a chart file, the rest kept byte for byte.
+#include <fstream>
+#include <iterator>
+
 #include "chart_model.h"
 #include "command_support.h"
 #include "commands.h"
 #include "file_paths.h"
+#include "keyword_edit.h"
 #include "keyword_names.h"
 #include "tool_error.h"
 #include "utf8_text.h"
@@ -10,17 +14,22 @@
 namespace swatchlog {
 
 const char* const kKeywordsHelp =
-    "Usage: swatchlog keywords CHART -o OUT KEY=VALUE...\n\n"
-    "Copies CHART to OUT with one keyword line per KEY=VALUE inserted after the\n"
-    "identification line. KEY is made of letters, digits and underscores; a KEY\n"
-    "the format does not define gets its KEYWORD declaration line as well. A\n"
-    "VALUE that is not a number is written in double quotes. OUT is written whole\n"
-    "or not at all and may not be CHART itself.\n";
+    "Usage: swatchlog keywords CHART -o OUT KEY=VALUE... [--table N]\n\n"
+    "Copies CHART to OUT with each KEY set to VALUE in the header. A KEY the\n"
+    "header already has keeps its line, with the new value (where it stands on\n"
+    "several lines, the last one, which is the one readers take); a new KEY gets\n"
+    "a line after the identification line (CGATS.17, CTI3 ...), which stays first,\n"
+    "and a KEYWORD declaration when the format does not define it. KEY is made of\n"
+    "letters, digits and underscores. A VALUE that is not a number is written in\n"
+    "double quotes. Every other byte of CHART is kept.\n"
+    "  --table N   the table whose header is set, in a file that holds several\n"
+    "              (default: the first with data rows)\n"
+    "OUT is written whole or not at all and may not be CHART itself.\n";
 
 namespace {
 
-KeywordList ParsePairs(const std::vector<std::string>& words) {
-    KeywordList pairs;
+std::vector<KeywordEdit> ParsePairs(const std::vector<std::string>& words) {
+    std::vector<KeywordEdit> pairs;
     for (const auto& word : words) {
         const std::size_t equals = word.find('=');
         if (equals == std::string::npos) {
@@ -33,7 +42,12 @@ KeywordList ParsePairs(const std::vector<std::string>& words) {
                              "beginning with a letter)");
         }
         if (IsStructuralKeyword(key)) {
-            throw UsageError(key + " describes the data and cannot be inserted as a keyword");
+            throw UsageError(key + " describes the data and cannot be set as a keyword");
+        }
+        for (const auto& earlier : pairs) {
+            if (earlier.key == key) {
+                throw UsageError(key + " is given twice");
+            }
         }
         bool ok = false;
         const std::string value = KeywordValueText(word.substr(equals + 1), ok);
@@ -41,28 +55,54 @@ KeywordList ParsePairs(const std::vector<std::string>& words) {
             throw UsageError("the value of " + key +
                              " cannot be written (it holds a line break or a double quote)");
         }
-        if (!IsStandardKeyword(key)) {
-            pairs.emplace_back("KEYWORD", "\"" + key + "\"");
-        }
-        pairs.emplace_back(key, value);
+        pairs.push_back({key, value});
     }
     return pairs;
+}
+
+std::string ReadText(const std::string& utf8Path) {
+    std::ifstream in(FileSystemPath(utf8Path), std::ios::binary);
+    std::string text((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
+    if (!in.eof() && in.fail()) {
+        throw ChartError(RepairUtf8(utf8Path) + ": the file cannot be read");
+    }
+    return text;
 }
 
 } // namespace
 
 int RunKeywords(const Words& args, std::ostream& /*out*/, std::ostream& /*err*/) {
-    const ParsedArguments parsed = ParseArguments(args, {{"output", 'o', true}});
+    const ParsedArguments parsed =
+        ParseArguments(args, {{"output", 'o', true}, {"table", '\0', true}});
     RequirePositionals(parsed, 2, static_cast<std::size_t>(-1),
                        parsed.positionals.empty() ? "the chart file" : "KEY=VALUE");
     const std::string input = parsed.positionals[0];
-    const KeywordList pairs = ParsePairs(
+    const std::vector<KeywordEdit> pairs = ParsePairs(
         std::vector<std::string>(parsed.positionals.begin() + 1, parsed.positionals.end()));
     const std::string output = RequireOutputPath(parsed, {input});
-    const Chart chart = Chart::Load(input);
-    WriteOutputFile(output, DefaultFailureText(output, input), [&](const std::wstring& temporary) {
-        return chart.Store().InsertKeywords(LibraryPath(input), temporary, pairs);
-    });
+    const Chart chart = Chart::Load(input, TableOption(parsed));
+    const ChartLines file(ReadText(input));
+    const TableExtent& table = chart.Loaded().Table();
+    const EditedText edited = SetKeywords(file, table, chart.Loaded().Text().header, pairs);
+
+    LibraryPath(output);
+    PendingOutput pending(output);
+    {
+        std::ofstream out(FileSystemPath(pending.TemporaryPath()), std::ios::binary);
+        out << edited.text;
+        out.close();
+        if (!out) {
+            throw ChartError(RepairUtf8(output) + ": the output file cannot be written");
+        }
+    }
+    // The edited table must read as the original did.
+    const Chart written = Chart::Load(pending.TemporaryPath(), table.number);
+    if (written.Patches().size() != chart.Patches().size() ||
+        written.Loaded().Tables().size() != chart.Loaded().Tables().size()) {
+        throw ChartError(chart.Name() + ": the file with the keywords set does not read as the "
+                                        "chart did; nothing was written");
+    }
+    pending.Commit();
     return kExitSuccess;
 }
 

@@ -11,13 +11,17 @@
 namespace swatchlog {
 
 const char* const kPatchesHelp =
-    "Usage: swatchlog patches CHART [--spaces LIST] [--format table|tsv|csv|json]\n\n"
-    "Prints one row per patch: the sample number and name first, then the values\n"
+    "Usage: swatchlog patches CHART [--spaces LIST] [--format table|tsv|csv|json]\n"
+    "                        [--table N]\n\n"
+    "Prints one row per patch: the sample number (its row in the file), the\n"
+    "file's SAMPLE_ID when it has one and the name first, then the values\n"
     "of the chosen colour spaces. LIST is a comma-separated choice of\n"
     "  cmyk, rgb, ncolor, html, cmykogv, xyz, lab, density, spectral\n"
     "(default: every space the chart carries except spectral). Values the library\n"
     "derived rather than read from the file are marked: '*' in the table header,\n"
-    "\" (derived)\" after the field name in TSV and CSV, and \"derived\": true in JSON.\n";
+    "\" (derived)\" after the field name in TSV and CSV, and \"derived\": true in JSON.\n"
+    "  --table N   the table of a file that holds several (default: the first\n"
+    "              with data rows)\n";
 
 namespace {
 
@@ -36,8 +40,7 @@ std::vector<Selection> Select(const Chart& chart, const ParsedArguments& parsed)
                 throw UsageError("unknown colour space \"" + RepairUtf8(key) + "\" in --spaces");
             }
             if (!chart.Has(space)) {
-                throw ChartError(RepairUtf8(chart.Path()) + ": the chart carries no " +
-                                 NameOf(space).title);
+                throw ChartError(chart.Name() + ": the chart carries no " + NameOf(space).title);
             }
             spaces.push_back(space);
         }
@@ -62,6 +65,9 @@ void PrintTable(const Chart& chart, const std::vector<Selection>& selection, Tab
                 std::ostream& out) {
     TextTable table;
     table.AddColumn("SAMPLE", true);
+    if (chart.HasSampleIds()) {
+        table.AddColumn("SAMPLE_ID", false);
+    }
     table.AddColumn("NAME", false);
     std::vector<std::string> derivedTitles;
     for (const auto& selected : selection) {
@@ -77,7 +83,12 @@ void PrintTable(const Chart& chart, const std::vector<Selection>& selection, Tab
     }
     int sample = 1;
     for (const auto& patch : chart.Patches()) {
-        std::vector<std::string> row{std::to_string(sample++), RepairUtf8(DisplayName(patch))};
+        std::vector<std::string> row{std::to_string(sample)};
+        if (chart.HasSampleIds()) {
+            row.push_back(RepairUtf8(chart.SampleId(static_cast<std::size_t>(sample - 1))));
+        }
+        row.push_back(RepairUtf8(DisplayName(patch)));
+        ++sample;
         for (const auto& selected : selection) {
             for (auto& cell : SpaceCells(patch, selected.space, selected.fields.size())) {
                 row.push_back(std::move(cell));
@@ -125,7 +136,14 @@ void PrintJson(const Chart& chart, const std::vector<Selection>& selection, std:
     for (const auto& patch : chart.Patches()) {
         json.BeginObject();
         json.Key("sample");
-        json.Integer(sample++);
+        json.Integer(sample);
+        json.Key("sample_id");
+        if (chart.HasSampleIds()) {
+            json.String(chart.SampleId(static_cast<std::size_t>(sample - 1)));
+        } else {
+            json.Null();
+        }
+        ++sample;
         json.Key("name");
         json.String(DisplayName(patch));
         for (const auto& selected : selection) {
@@ -153,11 +171,11 @@ void PrintJson(const Chart& chart, const std::vector<Selection>& selection, std:
 } // namespace
 
 int RunPatches(const Words& args, std::ostream& out, std::ostream& /*err*/) {
-    const ParsedArguments parsed =
-        ParseArguments(args, {{"spaces", '\0', true}, {"format", '\0', true}});
+    const ParsedArguments parsed = ParseArguments(
+        args, {{"spaces", '\0', true}, {"format", '\0', true}, {"table", '\0', true}});
     RequirePositionals(parsed, 1, 1, "the chart file");
     const OutputFormat format = ParseFormat(parsed, {"table", "tsv", "csv", "json"});
-    const Chart chart = Chart::Load(parsed.positionals[0]);
+    const Chart chart = Chart::Load(parsed.positionals[0], TableOption(parsed));
     const std::vector<Selection> selection = Select(chart, parsed);
     if (format.json) {
         PrintJson(chart, selection, out);

@@ -17,14 +17,15 @@
 namespace swatchlog {
 
 const char* const kRenderHelp =
-    "Usage: swatchlog render CHART -o OUT.svg [--samples LIST]\n\n"
+    "Usage: swatchlog render CHART -o OUT.svg [--samples LIST] [--table N]\n\n"
     "Draws every patch in its colour: sRGB from XYZ or L*a*b* (D50, adapted to D65\n"
     "with the Bradford transform), from the device values only where the chart has\n"
     "no colorimetry. Patches stand in their strips and columns when the chart gives\n"
     "NUMBER_OF_STRIPS and NUMBER_OF_COLS, else in a square grid; hovering shows the\n"
     "sample name and values. Below, the spectra are plotted: of all patches, or of\n"
     "the samples in LIST (comma-separated sample numbers). The picture needs no\n"
-    "more than a web browser. OUT is written whole or not at all.\n";
+    "more than a web browser. OUT is written whole or not at all. --table N\n"
+    "picks the table of a file that holds several (default: the first with data).\n";
 
 namespace {
 
@@ -106,12 +107,12 @@ std::set<int> SelectedSamples(const ParsedArguments& parsed, int patchCount) {
 } // namespace
 
 int RunRender(const Words& args, std::ostream& /*out*/, std::ostream& /*err*/) {
-    const ParsedArguments parsed =
-        ParseArguments(args, {{"output", 'o', true}, {"samples", '\0', true}});
+    const ParsedArguments parsed = ParseArguments(
+        args, {{"output", 'o', true}, {"samples", '\0', true}, {"table", '\0', true}});
     RequirePositionals(parsed, 1, 1, "the chart file");
     const std::string input = parsed.positionals[0];
     const std::string output = RequireOutputPath(parsed, {input});
-    const Chart chart = Chart::Load(input);
+    const Chart chart = Chart::Load(input, TableOption(parsed));
     const int count = static_cast<int>(chart.Patches().size());
     const std::set<int> plotted = SelectedSamples(parsed, count);
 
@@ -140,9 +141,12 @@ int RunRender(const Words& args, std::ostream& /*out*/, std::ostream& /*err*/) {
     }
     const PictureLayout layout =
         ChooseLayout(count, chart.Store().GetNumberOfStrips(), chart.Store().GetNumberOfCols());
-    const std::string svg = DrawChartSvg(RepairUtf8(FileSystemPath(input).filename().u8string()) +
-                                             " - " + std::to_string(count) + " patches",
-                                         pictures, layout);
+    std::string title = RepairUtf8(FileSystemPath(input).filename().u8string());
+    if (chart.Loaded().Tables().size() > 1) {
+        title += ", table " + std::to_string(chart.Loaded().Table().number);
+    }
+    const std::string svg =
+        DrawChartSvg(title + " - " + std::to_string(count) + " patches", pictures, layout);
 
     PendingOutput pending(output);
     {

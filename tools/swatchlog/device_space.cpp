@@ -25,12 +25,20 @@ std::string DeviceSpaceName(int space) {
 } // namespace
 
 DeviceSpace DescribeDevice(const Chart& chart) {
-    CSwatchlogBase& store = chart.Store();
+    return DescribeDevice(chart.Store(), chart.FileHasField("CMYK_C"), chart.Has(Space::Html));
+}
+
+DeviceSpace DescribeDevice(CSwatchlogBase& store, bool fileHasCmyk, bool anyHtml) {
     DeviceSpace device{DeviceSpaceName(store.GetDeviceColorSpace()), store.GetDeviceChannelCount()};
-    if (store.GetDeviceColorSpace() == COLORSPACE_CMYK && !chart.FileHasField("CMYK_C")) {
-        const bool html = chart.Has(Space::Html);
-        device.name = html ? "HTML colour" : "none";
-        device.channels = html ? 3 : 0;
+    // A chart of spectra alone reports CMYK: the densities its patches derive
+    // are kept as CMYK. It has no device values. An HTML colour is reported as
+    // CMYK too.
+    if (store.GetDeviceColorSpace() == COLORSPACE_CMYK && !fileHasCmyk) {
+        device.name = anyHtml ? "HTML colour" : "none";
+        device.channels = anyHtml ? 3 : 0;
+    }
+    if (device.name == "none") {
+        device.channels = 0;
     }
     return device;
 }

@@ -16,5 +16,8 @@ struct DeviceSpace {
 /// for a chart of spectra alone (its patches keep their densities as CMYK) and
 /// for one with HTML colours; those are told apart here.
 DeviceSpace DescribeDevice(const Chart& chart);
+/// The same for a chart object whose file has CMYK fields or not
+/// (`fileHasCmyk`) and of which any patch has an HTML colour or not.
+DeviceSpace DescribeDevice(CSwatchlogBase& store, bool fileHasCmyk, bool anyHtml);
 
 } // namespace swatchlog

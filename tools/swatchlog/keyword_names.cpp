@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <cctype>
+#include <utility>
 
 namespace swatchlog {
 namespace {
@@ -74,37 +75,24 @@ std::string KeywordValueText(const std::string& value, bool& ok) {
     return "\"" + inner + "\"";
 }
 
+bool IsLeadingKeyword(const std::string& keyword) {
+    return std::find(kLeadingKeywords.begin(), kLeadingKeywords.end(), keyword) !=
+           kLeadingKeywords.end();
+}
+
 std::vector<std::pair<std::string, std::string>>
-OutputKeywords(const std::vector<std::pair<std::string, std::string>>& keywords,
-               const std::vector<std::string>& processColors) {
+NewFileKeywordLines(std::vector<std::pair<std::string, std::string>> keywords) {
+    std::stable_partition(keywords.begin(), keywords.end(),
+                          [](const auto& line) { return IsLeadingKeyword(line.first); });
     std::vector<std::pair<std::string, std::string>> out{{"CGATS.17", ""}};
-    auto add = [&out](const std::string& key, const std::string& value) {
-        if (!IsStandardKeyword(key)) {
+    std::vector<std::string> announced;
+    for (auto& [key, value] : keywords) {
+        if (!IsStandardKeyword(key) &&
+            std::find(announced.begin(), announced.end(), key) == announced.end()) {
             out.emplace_back("KEYWORD", "\"" + key + "\"");
+            announced.push_back(key);
         }
-        out.emplace_back(key, value);
-    };
-    for (const char* leading : kLeadingKeywords) {
-        for (const auto& [key, value] : keywords) {
-            if (key == leading) {
-                add(key, value);
-            }
-        }
-    }
-    for (const auto& [key, value] : keywords) {
-        const bool leading = std::find(kLeadingKeywords.begin(), kLeadingKeywords.end(), key) !=
-                             kLeadingKeywords.end();
-        if (!leading && key != "NUMBER_OF_FIELDS" && key != "NUMBER_OF_SETS" &&
-            IsValidKeywordName(key)) {
-            add(key, value);
-        }
-    }
-    if (!processColors.empty()) {
-        out.emplace_back("KEYWORD", "\"PROCESSCOLOR_ID\"");
-        for (std::size_t i = 0; i < processColors.size(); ++i) {
-            out.emplace_back("PROCESSCOLOR_ID",
-                             "\"" + std::to_string(i + 1) + " " + processColors[i] + "\"");
-        }
+        out.emplace_back(std::move(key), std::move(value));
     }
     return out;
 }

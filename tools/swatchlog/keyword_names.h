@@ -21,14 +21,15 @@ bool IsValidKeywordName(const std::string& keyword);
 /// double quotes inside it).
 std::string KeywordValueText(const std::string& value, bool& ok);
 
-/// The keyword lines of a new chart file: "CGATS.17" first, the common
-/// descriptive keywords in the order readers expect, the others by their order
-/// in `keywords`, each keyword the format does not define declared by a KEYWORD
-/// line, then the process colour names as numbered PROCESSCOLOR_ID lines.
-/// NUMBER_OF_FIELDS, NUMBER_OF_SETS and names that cannot stand as keywords are
-/// left out (the writer adds the counts itself).
+/// Whether `keyword` is one of the descriptive keywords a new file puts first
+/// (ORIGINATOR, DESCRIPTOR, CREATED, MANUFACTURER ... PRINT_CONDITIONS).
+bool IsLeadingKeyword(const std::string& keyword);
+/// The keyword lines of a new chart file from header lines (key, value as
+/// written): "CGATS.17" first, then the leading keywords, then the others, each
+/// group in the given order; a keyword the format does not define gets a
+/// KEYWORD declaration before its first line. The caller leaves out what may
+/// not be written (counts, comments, invalid names).
 std::vector<std::pair<std::string, std::string>>
-OutputKeywords(const std::vector<std::pair<std::string, std::string>>& keywords,
-               const std::vector<std::string>& processColors);
+NewFileKeywordLines(std::vector<std::pair<std::string, std::string>> keywords);
 
 } // namespace swatchlog

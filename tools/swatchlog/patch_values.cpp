@@ -2,6 +2,8 @@
 
 #include <array>
 #include <cstdio>
+#include <limits>
+#include <optional>
 
 #include "number_format.h"
 
@@ -45,10 +47,12 @@ int SpaceDecimals(Space space) {
     }
 }
 
-std::vector<double> SpaceNumbers(const CColorPatch& patch, Space space, std::size_t fieldCount) {
-    if (!Chart::PatchHas(patch, space)) {
-        return {};
-    }
+namespace {
+
+// The patch's values of a space it holds, one per field; a field the patch has
+// no value for (a spectral field or n-colour channel it lacks) is left empty.
+std::vector<std::optional<double>> HeldValues(const CColorPatch& patch, Space space,
+                                              std::size_t fieldCount) {
     switch (space) {
     case Space::Cmyk: {
         const tagCMYK v = patch.GetCMYK();
@@ -59,7 +63,7 @@ std::vector<double> SpaceNumbers(const CColorPatch& patch, Space space, std::siz
         return {static_cast<double>(v.r), static_cast<double>(v.g), static_cast<double>(v.b)};
     }
     case Space::NColor: {
-        std::vector<double> values(fieldCount, 0.0);
+        std::vector<std::optional<double>> values(fieldCount);
         for (const auto& [position, channel] : patch.GetNColorMap()) {
             if (position >= 0 && static_cast<std::size_t>(position) < fieldCount) {
                 values[static_cast<std::size_t>(position)] = channel.value;
@@ -86,15 +90,28 @@ std::vector<double> SpaceNumbers(const CColorPatch& patch, Space space, std::siz
         return {v.red, v.green, v.blue, v.visual};
     }
     case Space::Spectral: {
-        std::vector<double> values;
+        std::vector<std::optional<double>> values;
         for (const auto& entry : patch.GetSpectralData()) {
-            values.push_back(entry.second);
+            values.emplace_back(entry.second);
         }
-        values.resize(fieldCount, 0.0);
+        values.resize(fieldCount);
         return values;
     }
     }
     return {};
+}
+
+} // namespace
+
+std::vector<double> SpaceNumbers(const CColorPatch& patch, Space space, std::size_t fieldCount) {
+    if (!Chart::PatchHas(patch, space)) {
+        return {};
+    }
+    std::vector<double> numbers;
+    for (const auto& value : HeldValues(patch, space, fieldCount)) {
+        numbers.push_back(value.value_or(std::numeric_limits<double>::quiet_NaN()));
+    }
+    return numbers;
 }
 
 std::string HtmlText(const CColorPatch& patch) {
@@ -113,8 +130,8 @@ std::vector<std::string> SpaceCells(const CColorPatch& patch, Space space, std::
         return {HtmlText(patch)};
     }
     std::vector<std::string> cells;
-    for (const double value : SpaceNumbers(patch, space, fieldCount)) {
-        cells.push_back(FormatFixed(value, SpaceDecimals(space)));
+    for (const auto& value : HeldValues(patch, space, fieldCount)) {
+        cells.push_back(value ? FormatFixed(*value, SpaceDecimals(space)) : std::string());
     }
     return cells;
 }

@@ -12,12 +12,14 @@ namespace swatchlog {
 std::vector<std::string> SpaceFields(const Chart& chart, Space space);
 /// Digits after the point when the space is printed in a table.
 int SpaceDecimals(Space space);
-/// The patch's values of the space, one per field; empty when the patch lacks it.
-/// The HTML colour has no numbers (see HtmlText).
+/// The patch's values of the space, one per field; empty when the patch lacks it,
+/// NaN (null in JSON) for a field the patch has no value for. The HTML colour has
+/// no numbers (see HtmlText).
 std::vector<double> SpaceNumbers(const CColorPatch& patch, Space space, std::size_t fieldCount);
 /// "#RRGGBB" of the patch's HTML colour.
 std::string HtmlText(const CColorPatch& patch);
-/// Table cells of the space for the patch; empty cells when the patch lacks it.
+/// Table cells of the space for the patch; empty cells when the patch lacks it, and
+/// for each field the patch has no value for (never a 0 in their place).
 std::vector<std::string> SpaceCells(const CColorPatch& patch, Space space, std::size_t fieldCount);
 /// The patch's label without the double quotes a file may put around it.
 std::string DisplayName(const CColorPatch& patch);

@@ -46,6 +46,19 @@ std::string DescribeWriteResult(int code) {
     }
 }
 
+std::string DescribeLibraryException(const std::exception& error) {
+    const std::string what = error.what();
+    if (what == "invalid stol argument" || what == "stol argument out of range") {
+        return "a layout keyword (NUMBER_OF_STRIPS, NUMBER_OF_COLS) or a spectral field name "
+               "does not hold a usable whole number (" +
+               what + ")";
+    }
+    if (what == "invalid string position") {
+        return "the spectral field names do not follow one naming scheme (" + what + ")";
+    }
+    return "the library stopped with an error: " + what;
+}
+
 std::string WithCode(const std::string& sentence, int code) {
     return sentence + " [code " + std::to_string(code) + "]";
 }

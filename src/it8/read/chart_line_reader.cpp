@@ -1,45 +1,21 @@
 #include "it8/read/chart_line_reader.h"
 
-#include <cstdint>
 #include <cstring>
-#include <fstream>
-#include <system_error>
 #include <utility>
 
 namespace it8 {
 
-bool ReadWholeFile(const std::filesystem::path& path, std::string& text) {
-    std::error_code error;
-    if (std::filesystem::is_directory(path, error)) {
-        return false;
-    }
-    std::ifstream in(path, std::ios::in | std::ios::binary);
-    if (!in.is_open()) {
-        return false;
-    }
-    text.clear();
-    // The size is only a hint, taken up to 1 GiB: a file that grew, shrank or has
-    // no size is read to its end in chunks.
-    const auto expected = std::filesystem::file_size(path, error);
-    if (!error && expected <= (std::uintmax_t{1} << 30)) {
-        text.resize(static_cast<std::size_t>(expected));
-        in.read(text.data(), static_cast<std::streamsize>(text.size()));
-        text.resize(static_cast<std::size_t>(in.gcount()));
-    }
-    constexpr std::size_t chunk = 64 * 1024;
-    while (in.good()) {
-        const std::size_t before = text.size();
-        text.resize(before + chunk);
-        in.read(text.data() + before, static_cast<std::streamsize>(chunk));
-        text.resize(before + static_cast<std::size_t>(in.gcount()));
-    }
-    return !in.bad();
-}
-
 bool HasCrLineEnds(const std::string& text) {
-    const std::size_t lineBreak = text.find_first_of("\r\n");
-    return lineBreak != std::string::npos && text[lineBreak] == '\r' &&
-           (lineBreak + 1 == text.size() || text[lineBreak + 1] != '\n');
+    const std::size_t lf = text.find('\n');
+    if (lf == std::string::npos) {
+        return text.find('\r') != std::string::npos;
+    }
+    const std::size_t firstLine = lf > 0 && text[lf - 1] == '\r' ? lf - 1 : lf;
+    if (firstLine <= kLongestFormatLine) {
+        return false;
+    }
+    const std::size_t cr = text.find('\r');
+    return cr != std::string::npos && cr <= kLongestFormatLine;
 }
 
 void ChartLineReader::Open(std::string text, bool crLineEnds) {

@@ -2,7 +2,6 @@
 #pragma once
 
 #include <cstddef>
-#include <filesystem>
 #include <string>
 
 namespace it8 {
@@ -14,11 +13,16 @@ struct LineSpan {
     std::size_t size = 0;
 };
 
-/// Reads a whole file into `text`. False when the path names a directory or the
-/// file cannot be opened or read.
-bool ReadWholeFile(const std::filesystem::path& path, std::string& text);
+/// The longest line the chart format knows, in characters.
+constexpr std::size_t kLongestFormatLine = 1023;
 
-/// True when the first line break of `text` is a CR that is not followed by LF.
+/// True when `text` is to be read with CR line ends. A text whose first line
+/// (the characters before its first LF, a CR right before that LF not counted)
+/// holds at most kLongestFormatLine characters is read with LF line ends,
+/// whatever CRs that line holds. A longer first line means CR line ends when a
+/// CR comes within the first kLongestFormatLine characters. A text without any
+/// LF is read with CR line ends when it holds a CR, so a CR-only file reads line
+/// by line whatever its length.
 bool HasCrLineEnds(const std::string& text);
 
 /// Serves the lines of a text one after the other. With LF line ends a CR right

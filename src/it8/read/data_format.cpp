@@ -40,7 +40,10 @@ int CIT8ReaderWriter::ReadDataFormat() {
             break;
         }
         for (const std::string_view token : tokens) {
-            if (column == std::numeric_limits<int>::max()) {
+            // A name longer than the longest line the format knows is no field
+            // name; every patch would carry a copy of it.
+            if (column == std::numeric_limits<int>::max() ||
+                token.size() > it8::kLongestFormatLine) {
                 return 1;
             }
             std::string name = ToUpperAscii(token);

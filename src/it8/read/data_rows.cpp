@@ -95,10 +95,24 @@ struct RowRecords {
     std::uint32_t mask = 0;
 };
 
+using Columns = std::map<std::string, int>;
+
+// True when every column of `columns` lies within a row of `count` values.
+bool ColumnsWithin(const Columns& columns, std::size_t count) {
+    for (const auto& entry : columns) {
+        if (entry.second < 0 || static_cast<std::size_t>(entry.second) >= count) {
+            return false;
+        }
+    }
+    return true;
+}
+
 // Reads the groups in a fixed order (CMYK, CMYK+RGB, CMYK+OGV, XYZ, Lab, RGB,
 // spectrum, HTML colour, n-colour channels, densities): a shared token is read
-// the second time in the form the first reading left it.
-RowRecords ReadRecords(const it8::RowLayout& layout, RowValues& row) {
+// the second time in the form the first reading left it. The spectral and
+// n-colour fields are taken in name order.
+RowRecords ReadRecords(const it8::RowLayout& layout, const Columns& spectralColumns,
+                       const Columns& nColorColumns, RowValues& row) {
     RowRecords r;
     if (layout.label >= 0) {
         r.label = std::string(row.Text(layout.label));
@@ -128,18 +142,18 @@ RowRecords ReadRecords(const it8::RowLayout& layout, RowValues& row) {
         r.rgb = {row.WholeNumber(layout.rgb[0]), row.WholeNumber(layout.rgb[1]),
                  row.WholeNumber(layout.rgb[2])};
     }
-    for (const it8::NamedColumn& field : layout.spectral) {
-        r.spectral.emplace_hint(r.spectral.end(), field.name, row.Number(field.column));
+    for (const auto& [name, column] : spectralColumns) {
+        r.spectral.emplace_hint(r.spectral.end(), name, row.Number(column));
     }
     if (layout.htmlColor < 0 || !ReadHtmlColor(row.Text(layout.htmlColor), r.html)) {
         r.html = tagHTMLCOLOR{};
         r.mask |= MISSING_HTMLCOLOR;
     }
     int channel = 0;
-    for (const it8::NamedColumn& field : layout.nColor) {
+    for (const auto& [name, column] : nColorColumns) {
         r.nColors.emplace_hint(
             r.nColors.end(), channel,
-            tagNCLR{field.colorantCount, channel, field.name, row.Number(field.column)});
+            tagNCLR{text_number::ParseIntLenient(name), channel, name, row.Number(column)});
         ++channel;
     }
     if (layout.hasDensity) {
@@ -164,7 +178,12 @@ int CIT8ReaderWriter::ReadDataRows() {
         return 7;
     }
     const it8::RowLayout layout =
-        it8::ResolveRowLayout(fieldColumns, spectralColumns, nColorColumns);
+        it8::ResolveRowLayout(fieldColumns, !spectralColumns.empty(), !nColorColumns.empty());
+    // Every patch carries its own copy of each spectral and n-colour field name.
+    // A row must hold at least one value per such name, so that the copies grow
+    // with the rows' length and never with the number of rows times a long
+    // format (data formats that map several names onto one column).
+    const std::size_t namesPerPatch = spectralColumns.size() + nColorColumns.size();
     bool endSeen = false;
     std::vector<it8::LineSpan> tokens;
     it8::LineSpan line;
@@ -176,15 +195,19 @@ int CIT8ReaderWriter::ReadDataRows() {
             endSeen = true;
         } else if (static_cast<long long>(tokens.size()) != numberOfFields ||
                    static_cast<long long>(layout.highestColumn) >=
-                       static_cast<long long>(tokens.size())) {
+                       static_cast<long long>(tokens.size()) ||
+                   namesPerPatch > tokens.size() ||
+                   !ColumnsWithin(spectralColumns, tokens.size()) ||
+                   !ColumnsWithin(nColorColumns, tokens.size())) {
             // A row with another number of values, or a format whose columns lie
-            // beyond the row's values, cannot be read.
+            // beyond the row's values or that names more spectral and n-colour
+            // fields than the row holds values, cannot be read.
             return 8;
         } else if (sampleNumber == std::numeric_limits<int>::max()) {
             return 8; // more rows than sample numbers
         } else {
             RowValues row(tokens);
-            RowRecords records = ReadRecords(layout, row);
+            RowRecords records = ReadRecords(layout, spectralColumns, nColorColumns, row);
             // The patch is built in its place in the store; a second data block
             // replaces the patch of the same sample number.
             auto stored = patches.find(sampleNumber);

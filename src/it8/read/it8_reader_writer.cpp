@@ -3,6 +3,7 @@
 
 #include <utility>
 
+#include "it8/chart_file_text.h"
 #include "it8/file_path.h"
 #include "it8/read/chart_line_reader.h"
 
@@ -29,9 +30,10 @@ int CIT8ReaderWriter::ReadChartFile(std::wstring path) {
         return 4;
     }
     // The whole file is read at once and closed again before parsing starts, so
-    // the parse works on memory and no file stays open on any way out.
+    // the parse works on memory and no file stays open on any way out. Only a
+    // regular file is read: a device or a pipe answers 3.
     std::string text;
-    if (!it8::ReadWholeFile(it8::ToFileSystemPath(path), text)) {
+    if (!it8::ReadChartFileText(it8::ToFileSystemPath(path), text)) {
         return 3;
     }
     crLineEnds = it8::HasCrLineEnds(text);

@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <cstddef>
 
-#include "patch/text_number.h"
 #include "redavudeva/records.h"
 
 namespace it8 {
@@ -30,15 +29,6 @@ bool ResolveGroup(const Columns& fields, const char* const (&names)[N],
     return true;
 }
 
-std::vector<NamedColumn> NamedColumns(const Columns& columns) {
-    std::vector<NamedColumn> named;
-    named.reserve(columns.size());
-    for (const auto& [name, column] : columns) {
-        named.push_back(NamedColumn{name, column, text_number::ParseIntLenient(name)});
-    }
-    return named;
-}
-
 template <std::size_t N> void RaiseTo(int& highest, bool used, const std::array<int, N>& columns) {
     if (used) {
         highest = std::max(highest, *std::max_element(columns.begin(), columns.end()));
@@ -47,8 +37,7 @@ template <std::size_t N> void RaiseTo(int& highest, bool used, const std::array<
 
 } // namespace
 
-RowLayout ResolveRowLayout(const Columns& fieldColumns, const Columns& spectralColumns,
-                           const Columns& nColorColumns) {
+RowLayout ResolveRowLayout(const Columns& fieldColumns, bool hasSpectral, bool hasNColor) {
     static const char* const cmykNames[] = {"CMYK_C", "CMYK_M", "CMYK_Y", "CMYK_K"};
     static const char* const cmykRgbNames[] = {"CMYK_C", "CMYK_M", "CMYK_Y", "CMYK_K",
                                                "RGB_R",  "RGB_G",  "RGB_B"};
@@ -77,8 +66,6 @@ RowLayout ResolveRowLayout(const Columns& fieldColumns, const Columns& spectralC
         layout.densityVisual = ColumnOf(fieldColumns, "D_VIS");
         layout.densityMajorFilter = ColumnOf(fieldColumns, "D_MAJOR_FILTER");
     }
-    layout.spectral = NamedColumns(spectralColumns);
-    layout.nColor = NamedColumns(nColorColumns);
 
     // Six-colour values are never read from named fields: names with "CLR" are
     // n-colour channels.
@@ -90,8 +77,8 @@ RowLayout ResolveRowLayout(const Columns& fieldColumns, const Columns& spectralC
     mask |= layout.hasLAB ? 0 : MISSING_LAB;
     mask |= layout.hasRGB ? 0 : MISSING_RGB;
     mask |= layout.hasDensity ? 0 : MISSING_DENSITY;
-    mask |= layout.spectral.empty() ? MISSING_SPECTRAL : 0;
-    mask |= layout.nColor.empty() ? MISSING_NCOLOR : 0;
+    mask |= hasSpectral ? 0 : MISSING_SPECTRAL;
+    mask |= hasNColor ? 0 : MISSING_NCOLOR;
     layout.formatMask = mask;
 
     int highest = std::max({layout.label, layout.referenceSample, layout.htmlColor,
@@ -103,11 +90,6 @@ RowLayout ResolveRowLayout(const Columns& fieldColumns, const Columns& spectralC
     RaiseTo(highest, layout.hasLAB, layout.lab);
     RaiseTo(highest, layout.hasRGB, layout.rgb);
     RaiseTo(highest, layout.hasDensity, layout.density);
-    for (const auto* group : {&layout.spectral, &layout.nColor}) {
-        for (const NamedColumn& named : *group) {
-            highest = std::max(highest, named.column);
-        }
-    }
     layout.highestColumn = highest;
     return layout;
 }

@@ -5,16 +5,8 @@
 #include <cstdint>
 #include <map>
 #include <string>
-#include <vector>
 
 namespace it8 {
-
-/// A spectral or n-colour field with its column.
-struct NamedColumn {
-    std::string name;
-    int column = -1;
-    int colorantCount = 0; ///< n-colour fields: the number the name begins with
-};
 
 /// Column of every value a data row supplies; -1 for a field the format lacks. A
 /// colour group counts as supplied only when every field it reads is in the
@@ -36,19 +28,19 @@ struct RowLayout {
     bool hasRGB = false;
     std::array<int, 3> rgb{};
     bool hasDensity = false;
-    std::array<int, 3> density{};      ///< red, green, blue
-    int densityVisual = -1;            ///< optional within the density group
-    int densityMajorFilter = -1;       ///< optional within the density group
-    std::vector<NamedColumn> spectral; ///< in name order
-    std::vector<NamedColumn> nColor;   ///< in name order; the position is the channel
+    std::array<int, 3> density{}; ///< red, green, blue
+    int densityVisual = -1;       ///< optional within the density group
+    int densityMajorFilter = -1;  ///< optional within the density group
     /// Missing-space bits that follow from the format alone (all but the HTML colour).
     std::uint32_t formatMask = 0;
-    /// Highest column a row is read from; -1 when no value is read.
+    /// Highest column a general field is read from; -1 when none is read.
     int highestColumn = -1;
 };
 
-RowLayout ResolveRowLayout(const std::map<std::string, int>& fieldColumns,
-                           const std::map<std::string, int>& spectralColumns,
-                           const std::map<std::string, int>& nColorColumns);
+/// The general fields' columns. Spectral and n-colour fields are read straight
+/// from their maps; only whether there are any enters the missing-space bits.
+/// Costs a fixed number of look-ups, whatever the number of fields.
+RowLayout ResolveRowLayout(const std::map<std::string, int>& fieldColumns, bool hasSpectral,
+                           bool hasNColor);
 
 } // namespace it8

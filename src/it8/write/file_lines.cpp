@@ -1,9 +1,5 @@
 // Reading a chart file as a list of trimmed, non-empty lines.
-#include <filesystem>
-#include <fstream>
-#include <iterator>
-#include <system_error>
-
+#include "it8/chart_file_text.h"
 #include "it8/file_path.h"
 #include "it8/it8_reader_writer.h"
 
@@ -28,21 +24,12 @@ std::string TrimSpaces(std::string line) {
 
 int CIT8ReaderWriter::ReadFileLines(std::wstring path, std::vector<std::string>& lines) {
     lines.clear();
-    const std::filesystem::path file = it8::ToFileSystemPath(path);
-    std::error_code ec;
-    if (std::filesystem::is_directory(file, ec)) {
+    // Read as bytes: every kind of line end is split off below anyway. Only a
+    // regular file is read, so a device or a pipe answers 21.
+    std::string text;
+    if (!it8::ReadChartFileText(it8::ToFileSystemPath(path), text)) {
         return 21;
     }
-    // Binary mode: every kind of line end is split off below anyway.
-    std::ifstream in(file, std::ios::in | std::ios::binary);
-    if (!in.is_open()) {
-        return 21;
-    }
-    std::string text{std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
-    if (in.bad()) {
-        return 21;
-    }
-    in.close();
 
     // The text ends at its first NUL character, as a C string would.
     const std::size_t nul = text.find('\0');

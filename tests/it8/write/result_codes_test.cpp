@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <filesystem>
+#include <fstream>
 #include <string>
 #include <vector>
 
@@ -94,11 +95,14 @@ TEST(WriterResultCodes, EachRefusalAnswersItsCodeAndLeavesNoTarget) {
     ASSERT_EQ(store.ReadChartFile(mixed), 0);
     EXPECT_EQ(store.AppendMissingColumns(source, Wide(out), true), 24);
     EXPECT_EQ(store.WriteTargetFile(mixed, Wide(out)), 1);
-    // A read-only target, and a device that accepts the open but fails every write.
+    // A read-only target (a privileged user may write it, and does), and a device
+    // that accepts the open but fails every write.
     const auto readOnly = dir.write("read-only.txt", "keep");
     fs::permissions(readOnly, fs::perms::owner_read);
-    EXPECT_EQ(WriteNew(store, readOnly), 23);
-    EXPECT_EQ(ReadBytes(readOnly), "keep");
+    if (!std::ofstream(readOnly, std::ios::app).is_open()) {
+        EXPECT_EQ(WriteNew(store, readOnly), 23);
+        EXPECT_EQ(ReadBytes(readOnly), "keep");
+    }
     fs::permissions(readOnly, fs::perms::owner_all); // so that the folder can be removed
 #if defined(__linux__)
     if (fs::exists("/dev/full")) {
