@@ -69,6 +69,9 @@ ChartObject ReadChart(const std::string& utf8Path, int table);
 /// of a chart whose file gives none.
 py::array_t<std::int64_t> SampleNumbers(std::size_t count);
 py::array NumbersAsIds(std::size_t count);
+/// The texts as a NumPy str array (bytes that are not UTF-8 kept as lone
+/// surrogates, as TextFromBytes does).
+py::array TextArray(const std::vector<std::string>& texts);
 
 /// A chart from arrays and lists (None for what is not given); ValueError or
 /// TypeError when they do not fit together.

@@ -31,59 +31,54 @@ bool FileHasField(const swatchlog::LoadedTable& table, const char* field) {
     return field != nullptr && swatchlog::FieldColumn(table.Text(), field) >= 0;
 }
 
+// An array of `rows` x `columns` whose values are still to be set.
+FloatArray RowsOf(std::size_t rows, std::size_t columns) {
+    return FloatArray({static_cast<py::ssize_t>(rows), static_cast<py::ssize_t>(columns)});
+}
+
 py::array_t<bool> FalseMask(std::size_t count) {
     py::array_t<bool> mask(static_cast<py::ssize_t>(count));
     std::fill_n(mask.mutable_data(), count, false);
     return mask;
 }
 
-// The values of a space of fixed width, in the order of its columns.
-template <std::size_t N> using Values = std::array<double, N>;
-Values<4> CmykOf(const CColorPatch& p) {
-    const tagCMYK v = p.GetCMYK();
-    return {v.c, v.m, v.y, v.k};
-}
-Values<3> RgbOf(const CColorPatch& p) {
-    const tagRGB v = p.GetRGB();
-    return {static_cast<double>(v.r), static_cast<double>(v.g), static_cast<double>(v.b)};
-}
-Values<3> XyzOf(const CColorPatch& p) {
-    const tagXYZ v = p.GetXYZ();
-    return {v.x, v.y, v.z};
-}
-Values<3> LabOf(const CColorPatch& p) {
-    const tagLAB v = p.GetLAB();
-    return {v.l, v.a, v.b};
-}
-Values<4> DensityOf(const CColorPatch& p) {
-    const tagDENSITY v = p.GetDensity();
-    return {v.red, v.green, v.blue, v.visual};
-}
+// One colour space of fixed width being filled row by row: a patch that
+// carries it gets its values, the others NaN. `derived` is the same for every
+// patch of a table: the library works a space out for every patch when the
+// data format lacks it.
+template <std::size_t N> class SpaceRows {
+public:
+    SpaceRows(std::size_t count, Space space, bool carried, bool derived)
+        : values_(RowsOf(count, N)), marks_(FalseMask(count)), space_(space), carried_(carried),
+          derived_(derived), row_(values_.mutable_data()), mark_(marks_.mutable_data()) {}
 
-// The rows of one space: a patch that carries it gets its values, the others
-// keep NaN. `derived` is the same for every patch of a table: the library
-// works a space out for every patch when the data format lacks it.
-template <std::size_t N, typename Get>
-void FillSpace(const PatchMap& patches, Space space, bool carried, bool derived, Get get,
-               ChartObject& out, const char* key) {
-    FloatArray values = NanArray(patches.size(), N);
-    py::array_t<bool> mask = FalseMask(patches.size());
-    if (carried) {
-        double* row = values.mutable_data();
-        bool* marks = mask.mutable_data();
-        for (const auto& [number, patch] : patches) {
-            if (swatchlog::Chart::PatchHas(patch, space)) {
-                const Values<N> numbers = get(patch);
-                std::copy(numbers.begin(), numbers.end(), row);
-                *marks = derived;
-            }
-            row += N;
-            ++marks;
+    /// Fills the next row from `patch`; `get` answers the space's N values.
+    template <typename Get> void Next(const CColorPatch& patch, Get get) {
+        if (carried_ && swatchlog::Chart::PatchHas(patch, space_)) {
+            const std::array<double, N> numbers = get(patch);
+            std::copy(numbers.begin(), numbers.end(), row_);
+            *mark_ = derived_;
+        } else {
+            std::fill_n(row_, N, kNaN);
         }
+        row_ += N;
+        ++mark_;
     }
-    out.fixed[key] = values;
-    out.derived[key] = mask;
-}
+
+    void Store(ChartObject& out, const char* key) {
+        out.fixed[key] = values_;
+        out.derived[key] = marks_;
+    }
+
+private:
+    FloatArray values_;
+    py::array_t<bool> marks_;
+    Space space_;
+    bool carried_;
+    bool derived_;
+    double* row_;
+    bool* mark_;
+};
 
 // The wavelength of a spectral field name: the number after its lead-in
 // (SPECTRAL_NM_380, SPECTRAL_380, NM380); NaN when it names none.
@@ -119,47 +114,56 @@ std::vector<std::string> SpectralFields(const PatchMap& patches) {
     return names;
 }
 
-// Spectra in wavelength order. A patch keeps its spectrum's values on a grid in
-// field-name order as well as in its map; the grid is read when it holds them
-// all, the map otherwise.
-void FillSpectra(const PatchMap& patches, ChartObject& out) {
+// Spectral columns in wavelength order: the wavelengths, and for each column
+// the position of its field in name order.
+struct SpectralColumns {
+    std::size_t fieldCount = 0;
+    std::vector<std::size_t> order;
+};
+
+SpectralColumns SortSpectralColumns(const PatchMap& patches, ChartObject& out) {
     const std::vector<std::string> fields = SpectralFields(patches);
     std::vector<double> nm(fields.size());
     std::transform(fields.begin(), fields.end(), nm.begin(), WavelengthOf);
-    std::vector<std::size_t> order(fields.size());
-    std::iota(order.begin(), order.end(), 0);
-    std::stable_sort(order.begin(), order.end(), [&nm](std::size_t a, std::size_t b) {
-        return nm[a] < nm[b] || (!std::isnan(nm[a]) && std::isnan(nm[b]));
-    });
+    SpectralColumns columns;
+    columns.fieldCount = fields.size();
+    columns.order.resize(fields.size());
+    std::iota(columns.order.begin(), columns.order.end(), 0);
+    std::stable_sort(columns.order.begin(), columns.order.end(),
+                     [&nm](std::size_t a, std::size_t b) {
+                         return nm[a] < nm[b] || (!std::isnan(nm[a]) && std::isnan(nm[b]));
+                     });
     out.wavelengths = FloatArray(static_cast<py::ssize_t>(fields.size()));
-    for (std::size_t c = 0; c < order.size(); ++c) {
-        out.wavelengths.mutable_at(c) = nm[order[c]];
+    for (std::size_t c = 0; c < columns.order.size(); ++c) {
+        out.wavelengths.mutable_at(c) = nm[columns.order[c]];
     }
-
-    out.spectra = NanArray(patches.size(), fields.size());
-    double* row = out.spectra.mutable_data();
-    for (const auto& [number, patch] : patches) {
-        if (patch.IsSpectralPresent()) {
-            const SpectralDataStruct grid = patch.GetSpectralDataStruct();
-            if (static_cast<std::size_t>(grid.count) == fields.size()) {
-                for (std::size_t c = 0; c < order.size(); ++c) {
-                    row[c] = grid.values[order[c]];
-                }
-            } else {
-                const std::vector<double> values =
-                    swatchlog::SpaceNumbers(patch, Space::Spectral, fields.size());
-                for (std::size_t c = 0; c < order.size(); ++c) {
-                    row[c] = values[order[c]];
-                }
-            }
-        }
-        row += fields.size();
-    }
-    out.derived["spectra"] = FalseMask(patches.size());
+    return columns;
 }
 
-// n-colour channels by position, named as the first patch with channels names them.
-void FillNColor(const PatchMap& patches, ChartObject& out) {
+// A patch's spectrum in wavelength order, NaN when it has none. A patch keeps
+// its spectrum's values on a grid in field-name order as well as in its map;
+// the grid is read when it holds them all, the map otherwise.
+void PutSpectrum(const CColorPatch& patch, const SpectralColumns& columns, double* row) {
+    const std::size_t count = columns.fieldCount;
+    if (!patch.IsSpectralPresent()) {
+        std::fill_n(row, count, kNaN);
+        return;
+    }
+    const SpectralDataStruct grid = patch.GetSpectralDataStruct();
+    if (static_cast<std::size_t>(grid.count) == count) {
+        for (std::size_t c = 0; c < count; ++c) {
+            row[c] = grid.values[columns.order[c]];
+        }
+        return;
+    }
+    const std::vector<double> values = swatchlog::SpaceNumbers(patch, Space::Spectral, count);
+    for (std::size_t c = 0; c < count; ++c) {
+        row[c] = values[columns.order[c]];
+    }
+}
+
+// n-colour channel names by position, as the first patch with channels names them.
+std::vector<std::string> NColorNames(const PatchMap& patches) {
     std::vector<std::string> names;
     for (const auto& [number, patch] : patches) {
         if (patch.IsNColorPresent()) {
@@ -169,20 +173,19 @@ void FillNColor(const PatchMap& patches, ChartObject& out) {
             break;
         }
     }
-    for (const auto& name : names) {
-        out.ncolorNames.append(TextFromBytes(name));
+    return names;
+}
+
+void PutChannels(const CColorPatch& patch, std::size_t count, double* row) {
+    if (count == 0) {
+        return;
     }
-    out.ncolor = NanArray(patches.size(), names.size());
-    double* row = out.ncolor.mutable_data();
-    for (const auto& [number, patch] : patches) {
-        if (patch.IsNColorPresent()) {
-            const std::vector<double> values =
-                swatchlog::SpaceNumbers(patch, Space::NColor, names.size());
-            std::copy(values.begin(), values.end(), row);
-        }
-        row += names.size();
+    if (!patch.IsNColorPresent()) {
+        std::fill_n(row, count, kNaN);
+        return;
     }
-    out.derived["ncolor"] = FalseMask(patches.size());
+    const std::vector<double> values = swatchlog::SpaceNumbers(patch, Space::NColor, count);
+    std::copy(values.begin(), values.end(), row);
 }
 
 std::vector<TableInfo> TablesOf(const swatchlog::LoadedTable& table) {
@@ -212,11 +215,7 @@ py::array SampleIdsOf(const swatchlog::LoadedTable& table, std::size_t count) {
     if (ids.size() != count || count == 0) {
         return NumbersAsIds(count);
     }
-    py::list texts;
-    for (const auto& id : ids) {
-        texts.append(TextFromBytes(id));
-    }
-    return py::module_::import("numpy").attr("array")(texts, "dtype"_a = "str");
+    return TextArray(ids);
 }
 
 ChartObject ChartFromTable(const swatchlog::LoadedTable& table) {
@@ -229,36 +228,79 @@ ChartObject ChartFromTable(const swatchlog::LoadedTable& table) {
     out.table = table.Table().number;
     out.sampleNumbers = SampleNumbers(count);
     out.sampleIds = SampleIdsOf(table, count);
+    for (const auto& [key, value] : swatchlog::TableKeywords(table)) {
+        out.keywords[TextFromBytes(key)] = TextFromBytes(value);
+    }
+
+    // What the tool's Chart::Has and Chart::Derived tell, patch by patch: CMYK
+    // a patch works out from its spectrum (as densities) is no device CMYK.
+    const bool fileHasCmyk = FileHasField(table, "CMYK_C");
+    const auto derived = [&table](Space space) {
+        return !FileHasField(table, swatchlog::SupplyingField(space));
+    };
+    SpaceRows<4> cmyk(count, Space::Cmyk, fileHasCmyk, false);
+    SpaceRows<3> rgb(count, Space::Rgb, true, derived(Space::Rgb));
+    SpaceRows<3> xyz(count, Space::Xyz, true, derived(Space::Xyz));
+    SpaceRows<3> lab(count, Space::Lab, true, derived(Space::Lab));
+    SpaceRows<4> density(count, Space::Density, true, derived(Space::Density));
+    const std::vector<std::string> channelNames = NColorNames(patches);
+    const std::size_t channels = channelNames.size();
+    out.ncolor = RowsOf(count, channels);
+    const SpectralColumns spectral = SortSpectralColumns(patches, out);
+    out.spectra = RowsOf(count, spectral.fieldCount);
+
+    // One walk over the patches fills every array: each patch is visited once,
+    // while it is in the cache.
+    double* channelRow = out.ncolor.mutable_data();
+    double* spectrumRow = out.spectra.mutable_data();
     bool anyHtml = false;
     for (const auto& [number, patch] : patches) {
         out.names.append(TextFromBytes(swatchlog::DisplayName(patch)));
         anyHtml = anyHtml || patch.IsHTMLCOLORPresent();
+        cmyk.Next(patch, [](const CColorPatch& p) {
+            const tagCMYK v = p.GetCMYK();
+            return std::array<double, 4>{v.c, v.m, v.y, v.k};
+        });
+        rgb.Next(patch, [](const CColorPatch& p) {
+            const tagRGB v = p.GetRGB();
+            return std::array<double, 3>{static_cast<double>(v.r), static_cast<double>(v.g),
+                                         static_cast<double>(v.b)};
+        });
+        xyz.Next(patch, [](const CColorPatch& p) {
+            const tagXYZ v = p.GetXYZ();
+            return std::array<double, 3>{v.x, v.y, v.z};
+        });
+        lab.Next(patch, [](const CColorPatch& p) {
+            const tagLAB v = p.GetLAB();
+            return std::array<double, 3>{v.l, v.a, v.b};
+        });
+        density.Next(patch, [](const CColorPatch& p) {
+            const tagDENSITY v = p.GetDensity();
+            return std::array<double, 4>{v.red, v.green, v.blue, v.visual};
+        });
+        PutChannels(patch, channels, channelRow);
+        channelRow += channels;
+        PutSpectrum(patch, spectral, spectrumRow);
+        spectrumRow += spectral.fieldCount;
     }
-    for (const auto& [key, value] : swatchlog::TableKeywords(table)) {
-        out.keywords[TextFromBytes(key)] = TextFromBytes(value);
+    cmyk.Store(out, "cmyk");
+    rgb.Store(out, "rgb");
+    xyz.Store(out, "xyz");
+    lab.Store(out, "lab");
+    density.Store(out, "density");
+    for (const auto& name : channelNames) {
+        out.ncolorNames.append(TextFromBytes(name));
     }
-    const bool fileHasCmyk = FileHasField(table, "CMYK_C");
+    out.derived["ncolor"] = FalseMask(count);
+    out.derived["spectra"] = FalseMask(count);
     out.device = swatchlog::DescribeDevice(store, fileHasCmyk, anyHtml).name;
-
-    // What the tool's Chart::Has and Chart::Derived tell, patch by patch: CMYK
-    // a patch works out from its spectrum (as densities) is no device CMYK.
-    const auto derived = [&table](Space space) {
-        return !FileHasField(table, swatchlog::SupplyingField(space));
-    };
-    FillSpace<4>(patches, Space::Cmyk, fileHasCmyk, false, CmykOf, out, "cmyk");
-    FillSpace<3>(patches, Space::Rgb, true, derived(Space::Rgb), RgbOf, out, "rgb");
-    FillSpace<3>(patches, Space::Xyz, true, derived(Space::Xyz), XyzOf, out, "xyz");
-    FillSpace<3>(patches, Space::Lab, true, derived(Space::Lab), LabOf, out, "lab");
-    FillSpace<4>(patches, Space::Density, true, derived(Space::Density), DensityOf, out, "density");
-    FillNColor(patches, out);
-    FillSpectra(patches, out);
     return out;
 }
 
 } // namespace
 
 FloatArray NanArray(std::size_t rows, std::size_t columns) {
-    FloatArray array({static_cast<py::ssize_t>(rows), static_cast<py::ssize_t>(columns)});
+    FloatArray array = RowsOf(rows, columns);
     std::fill_n(array.mutable_data(), rows * columns, kNaN);
     return array;
 }
@@ -270,11 +312,40 @@ py::array_t<std::int64_t> SampleNumbers(std::size_t count) {
 }
 
 py::array NumbersAsIds(std::size_t count) {
-    py::list texts;
+    std::vector<std::string> numbers;
+    numbers.reserve(count);
     for (std::size_t i = 1; i <= count; ++i) {
-        texts.append(py::str(std::to_string(i)));
+        numbers.push_back(std::to_string(i));
     }
-    return py::module_::import("numpy").attr("array")(texts, "dtype"_a = "str");
+    return TextArray(numbers);
+}
+
+py::array TextArray(const std::vector<std::string>& texts) {
+    std::size_t width = 1;
+    bool ascii = true;
+    for (const auto& text : texts) {
+        width = std::max(width, text.size());
+        ascii = ascii && std::all_of(text.begin(), text.end(),
+                                     [](char c) { return static_cast<unsigned char>(c) < 0x80; });
+    }
+    if (!ascii) {
+        py::list list;
+        for (const auto& text : texts) {
+            list.append(TextFromBytes(text));
+        }
+        return py::module_::import("numpy").attr("array")(list, "dtype"_a = "str");
+    }
+    // ASCII text goes straight into NumPy's fixed-width str array: one 32-bit
+    // code point per character, padded with zeros.
+    py::array array(py::dtype("U" + std::to_string(width)),
+                    std::vector<py::ssize_t>{static_cast<py::ssize_t>(texts.size())});
+    auto* points = static_cast<std::uint32_t*>(array.mutable_data());
+    std::fill_n(points, texts.size() * width, 0u);
+    for (std::size_t i = 0; i < texts.size(); ++i) {
+        std::transform(texts[i].begin(), texts[i].end(), points + i * width,
+                       [](char c) { return static_cast<std::uint32_t>(c); });
+    }
+    return array;
 }
 
 ChartObject ReadChart(const std::string& utf8Path, int table) {
