@@ -1,7 +1,7 @@
 """Type stubs of the redavudeva extension module."""
 
 import os
-from typing import Mapping, Optional, Sequence, Union, overload
+from typing import Literal, Mapping, Optional, Sequence, Union, overload
 
 import numpy as np
 import numpy.typing as npt
@@ -17,6 +17,29 @@ class ChartError(Exception):
     """The library's result code, or None when the failure is not one."""
     path: Optional[str]
     """The file the failure is about, or None."""
+    table: Optional[int]
+    """The number of the table read (1 for the first) in a file of several, else None."""
+    line: Optional[int]
+    """The line of the file the failure points at, or None."""
+
+class Table:
+    """One table of a chart file: a header, a data format and a data block."""
+
+    number: int
+    """The table's number in its file, 1 for the first (read(table=...))."""
+    first_line: int
+    """The table's first line in the file (counted from 1)."""
+    last_line: int
+    """The table's last line: its END_DATA line, or the file's end."""
+    @property
+    def data_line(self) -> Optional[int]:
+        """The line of its BEGIN_DATA, or None when it has no data block."""
+    rows: int
+    """The number of data rows in its data block."""
+    fields: tuple[str, ...]
+    """The data format's field names, upper case, in column order."""
+    identification: str
+    """The word alone on the table's first line ("CGATS.17", "CTI3" ...), or ""."""
 
 class Chart:
     """One chart: its patches in sample-number order and its header keywords."""
@@ -25,8 +48,17 @@ class Chart:
     def path(self) -> Optional[str]:
         """The file the chart was read from, or None for a chart built from arrays."""
     @property
-    def sample_ids(self) -> npt.NDArray[np.int64]:
+    def tables(self) -> tuple[Table, ...]:
+        """Every table of the file read; empty for a chart built from arrays."""
+    @property
+    def table(self) -> Optional[int]:
+        """The number of the table this chart holds, None for a chart built from arrays."""
+    @property
+    def sample_numbers(self) -> npt.NDArray[np.int64]:
         """Sample numbers 1 ... N of the patches, in data-row order."""
+    @property
+    def sample_ids(self) -> npt.NDArray[np.str_]:
+        """The file's SAMPLE_ID text of each patch; the sample numbers as text when it has none."""
     @property
     def names(self) -> list[str]:
         """Sample names without surrounding double quotes; empty strings when none."""
@@ -86,8 +118,8 @@ class Chart:
     def write(self, path: _Path) -> None:
         """Write the chart as a new CGATS.17 file through the new-file writer."""
 
-def read(path: _Path) -> Chart:
-    """Read the chart file at `path`."""
+def read(path: _Path, table: Optional[int] = None) -> Chart:
+    """Read table `table` (1 for the first; default: the first with data rows) of the chart file at `path`."""
 
 def merge(
     target: _Path,
@@ -96,10 +128,15 @@ def merge(
     *,
     append_missing: bool = False,
     exact: bool = False,
+    by: Literal["auto", "id", "name", "position"] = "auto",
+    allow_unpaired: bool = False,
+    device_tolerance: float = 1.0,
+    target_table: Optional[int] = None,
+    measured_table: Optional[int] = None,
 ) -> None:
     """Put the measurements of `measured` into the target file, written to `output`."""
 
-def write_target(chart: _Path, output: _Path) -> None:
+def write_target(chart: _Path, output: _Path, *, table: Optional[int] = None, force: bool = False) -> None:
     """Write `chart` reduced to its clean and white patches to `output`."""
 
 @overload
