@@ -1,6 +1,10 @@
 // The tool as a whole, and the commands that only read: info, patches, validate.
 #include "tool_runner.h"
 
+#if !defined(_WIN32)
+#include <sys/stat.h>
+#endif
+
 namespace tool_test {
 namespace {
 
@@ -31,6 +35,24 @@ TEST_F(ToolTest, UsageMistakesExitWithTwoFileErrorsWithOneOnStandardError) {
         ExpectIn(run.err, {c.message});
     }
 }
+
+#if !defined(_WIN32)
+TEST_F(ToolTest, DevicesAndPipesAreRefusedWithoutReading) {
+    // /dev/zero never ends and opening a pipe without a writer blocks: both must
+    // be refused before they are read, by every command that reads a chart.
+    ASSERT_EQ(mkfifo(dir.file("pipe.it8").c_str(), 0600), 0);
+    for (const std::string input : {"/dev/zero", "pipe.it8"}) {
+        for (const std::vector<std::string>& args : {std::vector<std::string>{"info", input},
+                                                     {"validate", input},
+                                                     {"keywords", input, "-o", "out.it8", "A=1"},
+                                                     {"convert", input, "-o", "out.it8"}}) {
+            const RunResult run = Tool(args);
+            EXPECT_EQ(run.status, 1) << args[0] << " " << input;
+            ExpectIn(run.err, {input + ": is a device or a pipe, not a chart file"});
+        }
+    }
+}
+#endif
 
 TEST_F(ToolTest, InfoDescribesTheChartInWords) {
     dir.write("four patches ü.it8",

@@ -149,6 +149,32 @@ TEST_F(ToolTest, ConvertListsWhatItChangesAndDrops) {
     ExpectIn(Tsv("ids.it8", "xyz"), {"1\tA1\tx1\t12.35\t20.00\t30.00\n2\tA2\tx2\t"});
 }
 
+TEST_F(ToolTest, ConvertAndMergeWriteNoValueAPatchDoesNotHave) {
+    // Two spectra every 20 nm; the second holds "nan" and so gives no colour.
+    std::string text = "CGATS.17\nNUMBER_OF_FIELDS 22\nBEGIN_DATA_FORMAT\nSAMPLE_ID";
+    std::string rows[2] = {"1", "2"};
+    for (int nm = 380; nm <= 780; nm += 20) {
+        text += " SPECTRAL_NM_" + std::to_string(nm);
+        rows[0] += " 0.5";
+        rows[1] += nm == 500 ? " nan" : " 0.5";
+    }
+    dir.write("spectra.it8", text + "\nEND_DATA_FORMAT\nNUMBER_OF_SETS 2\nBEGIN_DATA\n" + rows[0] +
+                                 "\n" + rows[1] + "\nEND_DATA\n");
+    const RunResult run = Tool({"convert", "spectra.it8", "-o", "out.it8"});
+    EXPECT_EQ(run.status, 0) << run.err;
+    ExpectIn(run.err, {"dropped: XYZ: no value for 1 of 2 patches (sample 2)",
+                       "dropped: L*a*b*: no value for 1 of 2 patches (sample 2)"});
+    EXPECT_EQ(Read("out.it8").find("XYZ_X"), std::string::npos);
+
+    dir.write("target.it8", "CGATS.17\nNUMBER_OF_FIELDS 2\nBEGIN_DATA_FORMAT\nSAMPLE_ID "
+                            "CMYK_C\nEND_DATA_FORMAT\nNUMBER_OF_SETS 2\nBEGIN_DATA\n1 0\n2 "
+                            "50\nEND_DATA\n");
+    const RunResult merge = Tool({"merge", "target.it8", "spectra.it8", "-o", "merged.it8"});
+    EXPECT_EQ(merge.status, 1);
+    ExpectIn(merge.err, {"sample 2 of spectra.it8 has no XYZ; nothing was written"});
+    EXPECT_FALSE(std::filesystem::exists(dir.file("merged.it8")));
+}
+
 TEST_F(ToolTest, KeywordsKeepTheIdentificationAndReplaceValuesInPlace) {
     for (const std::string end : {"\n", "\r\n"}) {
         const std::vector<std::string> lines{"CTI3",

@@ -1,8 +1,6 @@
 #include "chart_scan.h"
 
 #include <cstdlib>
-#include <fstream>
-#include <iterator>
 #include <set>
 
 #include "chart_lines.h"
@@ -156,11 +154,10 @@ ChartScan ScanChartText(const std::string& text, int firstLine) {
 }
 
 ChartScan ScanChartFile(const std::string& utf8Path) {
-    std::ifstream in(FileSystemPath(utf8Path), std::ios::binary);
-    if (!in) {
+    std::string text;
+    if (!ReadRegularFile(utf8Path, text)) {
         return ChartScan{};
     }
-    const std::string text((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
     return ScanChartText(text);
 }
 

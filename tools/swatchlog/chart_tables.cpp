@@ -60,26 +60,13 @@ std::string ReadWholeFile(const std::string& utf8Path) {
         throw TableReadError(RepairUtf8(utf8Path) + ": is a folder, not a chart file", 3, utf8Path,
                              0, 0);
     }
-    std::ifstream in(path, std::ios::binary);
-    if (!in) {
-        throw TableReadError(RepairUtf8(utf8Path) + ": " + WithCode(DescribeReadResult(3), 3), 3,
+    const bool exists = fs::exists(path, ec);
+    if (exists && !fs::is_regular_file(path, ec)) {
+        throw TableReadError(RepairUtf8(utf8Path) + ": is a device or a pipe, not a chart file", 3,
                              utf8Path, 0, 0);
     }
-    // The size is a hint taken up to 1 GiB; a file that grew, shrank or has no
-    // size (a pipe, a device) is read to its end in pieces.
     std::string text;
-    const auto size = fs::file_size(path, ec);
-    std::size_t piece = std::size_t{1} << 20;
-    if (!ec && size < (std::uintmax_t{1} << 30)) {
-        piece = std::max(piece, static_cast<std::size_t>(size) + 1);
-    }
-    while (in.good()) {
-        const std::size_t before = text.size();
-        text.resize(before + piece);
-        in.read(text.data() + before, static_cast<std::streamsize>(piece));
-        text.resize(before + static_cast<std::size_t>(in.gcount()));
-    }
-    if (in.bad()) {
+    if (!ReadRegularFile(utf8Path, text)) {
         throw TableReadError(RepairUtf8(utf8Path) + ": " + WithCode(DescribeReadResult(3), 3), 3,
                              utf8Path, 0, 0);
     }

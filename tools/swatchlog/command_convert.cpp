@@ -2,7 +2,6 @@
 // new-file writer, with everything it changes or drops listed.
 #include <algorithm>
 #include <fstream>
-#include <iterator>
 
 #include "chart_model.h"
 #include "command_support.h"
@@ -142,7 +141,39 @@ template <typename Record, typename Get> std::vector<Record> Collect(const Chart
     return list;
 }
 
-void HandListsToStore(const Chart& chart, const KeywordList& keywords) {
+// A column of the new file has a value on every row, so a space some patches
+// lack (a spectrum that gives no colour) cannot be written without making up
+// numbers for them: it is left out and the patches are named.
+bool Writable(const Chart& chart, Space space, std::vector<ConvertChange>& changes) {
+    if (!chart.Has(space)) {
+        return false;
+    }
+    std::vector<std::size_t> lacking;
+    const auto& patches = chart.Patches();
+    for (std::size_t i = 0; i < patches.size(); ++i) {
+        if (!Chart::PatchHas(patches[i], space)) {
+            lacking.push_back(i + 1);
+        }
+    }
+    if (lacking.empty()) {
+        return true;
+    }
+    std::string samples;
+    for (std::size_t i = 0; i < lacking.size() && i < 10; ++i) {
+        samples += (i == 0 ? "" : ", ") + std::to_string(lacking[i]);
+    }
+    if (lacking.size() > 10) {
+        samples += " and " + std::to_string(lacking.size() - 10) + " more";
+    }
+    changes.push_back({"dropped", std::string(NameOf(space).title) + ": no value for " +
+                                      std::to_string(lacking.size()) + " of " +
+                                      std::to_string(patches.size()) + " patches (sample " +
+                                      samples + "), and the new-file format has no empty cells"});
+    return false;
+}
+
+void HandListsToStore(const Chart& chart, const KeywordList& keywords,
+                      std::vector<ConvertChange>& changes) {
     CSwatchlogBase& store = chart.Store();
     const auto& patches = chart.Patches();
     store.SetKeywordList(keywords);
@@ -152,31 +183,34 @@ void HandListsToStore(const Chart& chart, const KeywordList& keywords) {
         store.SetSampleNameList(
             Collect<std::string>(chart, [](const CColorPatch& p) { return p.GetLabel(); }));
     }
-    if (chart.Has(Space::Cmyk)) {
+    if (Writable(chart, Space::Cmyk, changes)) {
         store.SetCMYKList(
             Collect<tagCMYK>(chart, [](const CColorPatch& p) { return p.GetCMYK(); }));
     }
-    if (chart.Has(Space::Rgb) && !chart.Derived(Space::Rgb)) {
+    if (!chart.Derived(Space::Rgb) && Writable(chart, Space::Rgb, changes)) {
         store.SetRGBList(Collect<tagRGB>(chart, [](const CColorPatch& p) { return p.GetRGB(); }));
     }
-    if (chart.Has(Space::NColor)) {
+    if (Writable(chart, Space::NColor, changes)) {
         store.SetNColorList(Collect<std::map<int, tagNCLR>>(
             chart, [](const CColorPatch& p) { return p.GetNColorMap(); }));
     }
-    if (chart.Has(Space::Spectral)) {
+    if (Writable(chart, Space::Spectral, changes)) {
         store.SetSpectralDataList(store.GetSpectralDataList(), false);
     }
-    if (chart.Has(Space::Xyz)) {
+    if (Writable(chart, Space::Xyz, changes)) {
         store.SetXYZList(Collect<tagXYZ>(chart, [](const CColorPatch& p) { return p.GetXYZ(); }));
     }
-    if (chart.Has(Space::Lab)) {
+    if (Writable(chart, Space::Lab, changes)) {
         store.SetLABList(Collect<tagLAB>(chart, [](const CColorPatch& p) { return p.GetLAB(); }));
     }
 }
 
 std::string ReadText(const std::string& utf8Path) {
-    std::ifstream in(FileSystemPath(utf8Path), std::ios::binary);
-    return std::string((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
+    std::string text;
+    if (!ReadRegularFile(utf8Path, text)) {
+        throw ChartError(RepairUtf8(utf8Path) + ": the file cannot be read");
+    }
+    return text;
 }
 
 // The new-file writer numbers the rows; put the file's own SAMPLE_ID back at
@@ -237,7 +271,8 @@ int RunConvert(const Words& args, std::ostream& /*out*/, std::ostream& err) {
             << " has no SAMPLE_ID; the row numbers are written\n";
     }
     KeywordPlan plan = PlanKeywords(chart, chart.Has(Space::Spectral));
-    HandListsToStore(chart, plan.lines);
+    std::vector<ConvertChange> changes = plan.changes;
+    HandListsToStore(chart, plan.lines, changes);
 
     LibraryPath(output);
     PendingOutput pending(output);
@@ -253,7 +288,6 @@ int RunConvert(const Words& args, std::ostream& /*out*/, std::ostream& err) {
     if (keepIds) {
         RestoreSampleIds(chart, pending.TemporaryPath());
     }
-    std::vector<ConvertChange> changes = plan.changes;
     try {
         const Chart written = Chart::Load(pending.TemporaryPath());
         if (written.Patches().size() != chart.Patches().size()) {

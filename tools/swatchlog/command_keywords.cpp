@@ -1,6 +1,5 @@
 // swatchlog keywords: header keywords set in a chart file, the rest kept byte for byte.
 #include <fstream>
-#include <iterator>
 
 #include "chart_model.h"
 #include "command_support.h"
@@ -61,9 +60,8 @@ std::vector<KeywordEdit> ParsePairs(const std::vector<std::string>& words) {
 }
 
 std::string ReadText(const std::string& utf8Path) {
-    std::ifstream in(FileSystemPath(utf8Path), std::ios::binary);
-    std::string text((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
-    if (!in.eof() && in.fail()) {
+    std::string text;
+    if (!ReadRegularFile(utf8Path, text)) {
         throw ChartError(RepairUtf8(utf8Path) + ": the file cannot be read");
     }
     return text;

@@ -12,6 +12,10 @@ std::filesystem::path FileSystemPath(const std::string& utf8Path);
 /// The command-line path as the library's wide-string path; ChartError when
 /// the path is not valid UTF-8.
 std::wstring LibraryPath(const std::string& utf8Path);
+/// Reads the whole of a regular file (also through links) into `text`. False
+/// for anything else: a missing or unreadable file, a folder, and devices and
+/// pipes, which are never opened since they may not end or may block.
+bool ReadRegularFile(const std::string& utf8Path, std::string& text);
 /// Whether two paths name the same file (also through links); a path that does
 /// not exist yet is compared by its normalised absolute form.
 bool SameFile(const std::string& first, const std::string& second);
