@@ -37,6 +37,10 @@ def test_missing_file_and_unwritable_output(tmp_path):
     with pytest.raises(redavudeva.ChartError, match="is a folder") as raised:
         redavudeva.read(tmp_path)
     assert (raised.value.code, raised.value.path) == (3, str(tmp_path))
+    # A device is refused unopened: reading it could block or never end.
+    with pytest.raises(redavudeva.ChartError, match="is a device or a pipe") as raised:
+        redavudeva.read("/dev/zero")
+    assert raised.value.code == 3
     chart = redavudeva.Chart.from_arrays(lab=[[50, 0, 0]])
     with pytest.raises(redavudeva.ChartError) as raised:
         chart.write(tmp_path / "no such folder" / "out.it8")
