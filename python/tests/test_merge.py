@@ -32,6 +32,7 @@ MERGES = {
     "append missing": (measured([2, 3, 1]), dict(append_missing=True), ["--append-missing"]),
     "a target patch without a measurement": (measured([1, 2]), {}, []),
     "a measurement without a target patch": (EXTRA, {}, []),
+    "left out with allow_unpaired": (EXTRA, dict(allow_unpaired=True), ["--allow-unpaired"]),
     "device values of another chart": (measured([1, 2, 3], shift=-5), {}, []),
     "a wider device tolerance": (measured([1, 2, 3], shift=-5), dict(device_tolerance=6),
                                  ["--device-tolerance", "6"]),
@@ -68,18 +69,6 @@ def test_merge_does_what_the_tool_does(tmp_path, write_chart, swatchlog, case):
     if not options.get("append_missing"):
         # Each target patch carries the L*a*b* measured for its own id.
         np.testing.assert_array_equal(redavudeva.read(ours).lab, [LAB[1], LAB[2], LAB[3]])
-
-
-def test_merge_refusals_say_why(tmp_path, write_chart):
-    target = write_chart(chart_text(["SAMPLE_ID"] + CMYK, [[i] + DEVICE[i] for i in (1, 2, 3)]))
-    with pytest.raises(redavudeva.ChartError, match=r"1 of 3 patches .*\(sample 3\) has no partner"):
-        redavudeva.merge(target, write_chart(measured([1, 2])), tmp_path / "out.it8")
-    with pytest.raises(redavudeva.ChartError, match="differ in their CMYK values by more than 1"):
-        redavudeva.merge(target, write_chart(measured([1, 2, 3], shift=-5)), tmp_path / "out.it8")
-    with pytest.raises(redavudeva.ChartError, match="allow-unpaired"):
-        redavudeva.merge(target, write_chart(EXTRA), tmp_path / "out.it8")
-    with pytest.warns(UserWarning, match="left out 1 of 4 patches"):
-        redavudeva.merge(target, write_chart(EXTRA), tmp_path / "out.it8", allow_unpaired=True)
 
 
 @pytest.mark.parametrize("options, words", [

@@ -90,6 +90,7 @@ def test_from_arrays_copies_its_inputs():
     assert chart.lab[0, 0] == 50.0
 
 
+@pytest.mark.filterwarnings("ignore:the device values were not compared")
 def test_merge_and_target_write_what_the_tool_writes(tmp_path, swatchlog):
     target, sheet = EXAMPLES / "press_target.it8", EXAMPLES / "press_sheet.it8"
     cases = [
