@@ -354,7 +354,11 @@ ChartObject ReadChart(const std::string& utf8Path, int table) {
         py::gil_scoped_release unlocked;
         loaded.emplace(swatchlog::LoadTable(utf8Path, table));
     }
-    return ChartFromTable(*loaded);
+    ChartObject chart = ChartFromTable(*loaded);
+    // Letting go of the chart object's patches takes a while; other threads may run meanwhile.
+    py::gil_scoped_release unlocked;
+    loaded.reset();
+    return chart;
 }
 
 } // namespace redavudeva_python

@@ -309,9 +309,13 @@ PYBIND11_MODULE(_redavudeva, module) {
             if (!c.path.is_none()) {
                 text += ", from " + std::string(py::repr(c.path));
             }
+            if (c.tables.size() > 1) {
+                text +=
+                    ", table " + std::to_string(c.table) + " of " + std::to_string(c.tables.size());
+            }
             return text + ">";
         },
-        "A short description: patch count, device space, file.");
+        "A short description: patch count, device space, file and table.");
     chart.def_static(
         "from_arrays", &redavudeva_python::ChartFromArrays, kFromArraysDoc, py::kw_only(),
         "names"_a = py::none(), "cmyk"_a = py::none(), "rgb"_a = py::none(), "xyz"_a = py::none(),
