@@ -73,11 +73,14 @@ constexpr const char* kWriteDoc =
     "channels and spectra, each colour space that holds any value (RGB the\n"
     "library derived is left out; densities have no columns in this format).\n"
     "CMYK, XYZ, L*a*b* and channels are written with 2 decimals, spectra with 5,\n"
-    "RGB as whole numbers. The file appears whole or not at all.\n\n"
+    "RGB as whole numbers; the rows are numbered 1 ... N as SAMPLE_ID. The file\n"
+    "appears whole or not at all, and an existing file keeps its identity\n"
+    "(permissions, links), as with the swatchlog tool's outputs.\n\n"
     "Raises ValueError when the chart has no patches or no values, when a\n"
     "written colour space lacks a value for some patch (NaN), or when a name,\n"
     "keyword or wavelength cannot be written; ChartError when the file cannot\n"
-    "be written (code 23).\n";
+    "be written (code 23 when the library's writer cannot open it, None when\n"
+    "it is refused before: a missing folder, a folder in its place ...).\n";
 
 constexpr const char* kMergeDoc =
     "Put the measurements of the chart file `measured` (L*a*b*, XYZ, spectra and\n"

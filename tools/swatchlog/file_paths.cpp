@@ -1,9 +1,7 @@
 #include "file_paths.h"
 
 #include <algorithm>
-#include <chrono>
 #include <fstream>
-#include <random>
 #include <system_error>
 
 #include "tool_error.h"
@@ -67,37 +65,6 @@ bool SameFile(const std::string& first, const std::string& second) {
     const fs::path normalA = fs::weakly_canonical(fs::absolute(a, ec), ec);
     const fs::path normalB = fs::weakly_canonical(fs::absolute(b, ec), ec);
     return normalA == normalB;
-}
-
-PendingOutput::PendingOutput(std::string finalPath) : final_(std::move(finalPath)) {
-    const fs::path target = FileSystemPath(final_);
-    std::error_code ec;
-    if (fs::is_directory(target, ec)) {
-        throw ChartError(final_ + ": is a folder, not a file", final_, 0);
-    }
-    std::random_device random;
-    const auto stamp = std::chrono::steady_clock::now().time_since_epoch().count();
-    const std::string name = target.filename().u8string();
-    const std::string suffix =
-        ".swatchlog-" + std::to_string(random()) + "-" + std::to_string(stamp) + ".tmp";
-    const fs::path parent = target.parent_path();
-    temporary_ = (parent.empty() ? std::string() : parent.u8string() + "/") + "." + name + suffix;
-}
-
-PendingOutput::~PendingOutput() {
-    if (!committed_) {
-        std::error_code ec;
-        fs::remove(FileSystemPath(temporary_), ec);
-    }
-}
-
-void PendingOutput::Commit() {
-    std::error_code ec;
-    fs::rename(FileSystemPath(temporary_), FileSystemPath(final_), ec);
-    if (ec) {
-        throw ChartError(final_ + ": cannot be written (" + ec.message() + ")", final_, 0);
-    }
-    committed_ = true;
 }
 
 } // namespace swatchlog

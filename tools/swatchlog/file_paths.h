@@ -3,6 +3,7 @@
 #pragma once
 
 #include <filesystem>
+#include <memory>
 #include <string>
 
 namespace swatchlog {
@@ -20,9 +21,25 @@ bool ReadRegularFile(const std::string& utf8Path, std::string& text);
 /// not exist yet is compared by its normalised absolute form.
 bool SameFile(const std::string& first, const std::string& second);
 
-/// An output file written first under a temporary name beside it and renamed
-/// into place by Commit(), so that a failure leaves no output file and an
-/// existing one untouched. The temporary file is removed unless committed.
+/// An output file written first under a temporary name and put in place by
+/// Commit(), so that a failure leaves no output file and an existing one
+/// untouched. The temporary file is removed unless committed.
+///
+/// An existing output is opened for writing (not truncated) when the object is
+/// made: one the user may not write, a folder or a loop of symbolic links is
+/// refused there with ChartError (the file and the reason) before any work is
+/// done. A symbolic link is followed to the file it names. The temporary file is
+/// made at once, empty, with no more permissions than the output it replaces
+/// (a new output gets the usual mode for a new file).
+///
+/// Commit() renames the temporary file over the output where that keeps the
+/// output's identity: a new output, or on POSIX the user's own regular file with
+/// one link and no extended attributes or access lists, given its group and mode.
+/// Any other existing output (on Windows every one) gets the new content copied
+/// in place and keeps its owner, permissions, links and attributes; when that
+/// copy fails its old content is put back where it can be, and the ChartError
+/// says which state the output was left in. A device or a pipe is written as it
+/// is.
 class PendingOutput {
 public:
     explicit PendingOutput(std::string finalPath);
@@ -30,14 +47,16 @@ public:
     PendingOutput(const PendingOutput&) = delete;
     PendingOutput& operator=(const PendingOutput&) = delete;
 
-    /// The temporary file's path (UTF-8) for the writer to create.
+    /// The temporary file's path (UTF-8) for the writer to fill; it exists, empty.
     const std::string& TemporaryPath() const { return temporary_; }
-    /// Moves the written temporary file to the final path; ChartError on failure.
+    /// Puts the written temporary file's content in place; ChartError on failure.
     void Commit();
 
 private:
+    struct Target; // the output as the platform holds it open
     std::string final_;
     std::string temporary_;
+    std::unique_ptr<Target> target_;
     bool committed_ = false;
 };
 
