@@ -9,7 +9,8 @@ namespace swatchlog {
 ChartError OutputError(const std::string& output, const std::string& reason,
                        const std::string& state) {
     return ChartError(RepairUtf8(output) + ": the output file cannot be written (" + reason + ")" +
-                      (state.empty() ? "" : "; " + state));
+                          (state.empty() ? "" : "; " + state),
+                      output, 0);
 }
 
 void CopyInPlace(OpenOutput& file, std::uint64_t oldSize, bool readable, const std::string& text,
