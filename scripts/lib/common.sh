@@ -31,9 +31,13 @@ ensure_packages() {
     DEBIAN_FRONTEND=noninteractive apt-get install -y -qq $recommends "${missing[@]}" >/dev/null
 }
 
-# Packages every build needs.
+# Packages every build needs (the presets that test build the Python module).
 BUILD_PACKAGES=(cmake ninja-build g++ clang libgtest-dev libbenchmark-dev liblcms2-dev pkg-config jq python3 acl
-    argyll-ref colord-data)
+    argyll-ref colord-data pybind11-dev python3-dev python3-numpy python3-pytest)
+
+# Packages of installing the Python package with pip into a virtual environment.
+PYTHON_PACKAGES=(cmake ninja-build g++ pybind11-dev python3-dev python3-numpy python3-pytest python3-pip
+    python3-setuptools python3-venv python3-wheel)
 
 section() {
     echo

@@ -93,28 +93,33 @@ bool Chart::Has(Space space) const {
                        [space](const CColorPatch& patch) { return PatchHas(patch, space); });
 }
 
-bool Chart::Derived(Space space) const {
-    if (!Has(space)) {
-        return false;
-    }
+const char* SupplyingField(Space space) {
     switch (space) {
+    case Space::Cmyk:
+        return "CMYK_C";
     case Space::Rgb:
-        return !FileHasField("RGB_R");
+        return "RGB_R";
     case Space::Xyz:
-        return !FileHasField("XYZ_X");
+        return "XYZ_X";
     case Space::Lab:
-        return !FileHasField("LAB_L");
+        return "LAB_L";
     case Space::Density:
-        return !FileHasField("D_RED");
+        return "D_RED";
     default:
-        return false;
+        return nullptr;
     }
 }
 
-KeywordList Chart::Keywords() const {
+bool Chart::Derived(Space space) const {
+    const char* field = SupplyingField(space);
+    return field != nullptr && Has(space) && !FileHasField(field);
+}
+
+KeywordList TableKeywords(const LoadedTable& table) {
     KeywordList keywords;
-    for (const auto& [key, value] : Store().GetKeywords()) {
-        if (key == Identification() || key.empty() || key[0] == '#' || key == "KEYWORD" ||
+    const std::string& identification = table.Table().identification;
+    for (const auto& [key, value] : table.Chart().GetKeywords()) {
+        if (key == identification || key.empty() || key[0] == '#' || key == "KEYWORD" ||
             key == "PROCESSCOLOR_ID") {
             continue;
         }

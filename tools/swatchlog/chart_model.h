@@ -30,6 +30,18 @@ bool SpaceFromKey(const std::string& key, Space& space);
 
 using KeywordList = std::vector<std::pair<std::string, std::string>>;
 
+/// The data-format field whose presence means the file supplies the space
+/// itself ("CMYK_C", "RGB_R", "XYZ_X", "LAB_L", "D_RED"); a space the library
+/// works out has none of these in its file. Null for the other spaces, which
+/// the library never works out.
+const char* SupplyingField(Space space);
+
+/// Header keywords of a table the library has read, without the
+/// identification, comments, KEYWORD declarations and PROCESSCOLOR_ID (the
+/// library keeps only the last of those lines; GetProcessColorNames has them
+/// all), values without their trailing blank, in key order.
+KeywordList TableKeywords(const LoadedTable& table);
+
 class Chart {
 public:
     /// Reads table `table` (0: the first with data) of the chart at `path`
@@ -59,11 +71,8 @@ public:
     /// The word alone on the table's first line ("CGATS.17", "IT8.7/2" ...);
     /// empty when that line holds anything else.
     const std::string& Identification() const { return loaded_.Table().identification; }
-    /// Header keywords without the identification, comments, KEYWORD
-    /// declarations and PROCESSCOLOR_ID (the chart keeps only the last of those
-    /// lines; GetProcessColorNames has them all), values without their trailing
-    /// blank, in key order.
-    KeywordList Keywords() const;
+    /// The table's header keywords (TableKeywords).
+    KeywordList Keywords() const { return TableKeywords(loaded_); }
     /// Spectral field names of the first patch with a spectrum, in name order.
     std::vector<std::string> SpectralFields() const;
     /// n-colour channel names of the first patch with channels, by position.

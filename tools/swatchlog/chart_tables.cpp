@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <chrono>
+#include <exception>
 #include <filesystem>
 #include <fstream>
 #include <random>
@@ -216,10 +217,10 @@ LoadedTable LoadTable(const std::string& utf8Path, int number) {
         number = DefaultTable(loaded.tables_);
     }
     if (number < 1 || number > count) {
-        throw TableReadError(RepairUtf8(utf8Path) + ": the file holds " + std::to_string(count) +
-                                 (count == 1 ? " table" : " tables") + ", not a table " +
-                                 std::to_string(number),
-                             0, utf8Path, number, 0);
+        throw NoSuchTable(RepairUtf8(utf8Path) + ": the file holds " + std::to_string(count) +
+                              (count == 1 ? " table" : " tables") + ", not a table " +
+                              std::to_string(number),
+                          0, utf8Path, number, 0);
     }
     loaded.number_ = number;
     const TableExtent& table = loaded.Table();
@@ -248,8 +249,9 @@ LoadedTable LoadTable(const std::string& utf8Path, int number) {
     try {
         code = loaded.chart_->ReadChartFile(loaded.libraryPath_);
     } catch (const std::exception& error) {
-        throw TableReadError(where + ": " + DescribeLibraryException(error), 0, utf8Path,
-                             tableNumber, 0, error.what());
+        // The library's exception stays attached, for callers that tell its kind apart.
+        std::throw_with_nested(TableReadError(where + ": " + DescribeLibraryException(error), 0,
+                                              utf8Path, tableNumber, 0, error.what()));
     }
     if (code != 0) {
         const ChartScan scan = ScanChartText(loaded.lines_->Text(), loaded.firstLine_);

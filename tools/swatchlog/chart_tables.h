@@ -12,6 +12,7 @@
 
 #include <memory>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include <redavudeva/redavudeva.h>
@@ -38,16 +39,16 @@ struct TableExtent {
 
 /// A chart file that cannot be read, or a table of it: the message names the
 /// file, the table (for files of several tables) and the line where known.
+/// Code() is the library's result code (3 cannot open, 5 data format ... 9 no
+/// data), or 0 for a failure that has none (a bad table number, an exception);
+/// Path() is the chart file. When the library's read ended with a standard
+/// exception, that exception is attached as the nested exception.
 class TableReadError : public ChartError {
 public:
     TableReadError(const std::string& message, int code, std::string path, int table, int line,
                    std::string libraryException = "")
-        : ChartError(message), code_(code), path_(std::move(path)), table_(table), line_(line),
+        : ChartError(message, std::move(path), code), table_(table), line_(line),
           libraryException_(std::move(libraryException)) {}
-    /// The library's result code (3 cannot open, 5 data format ... 9 no data),
-    /// or 0 for a failure that has none (a bad table number, an exception).
-    int Code() const { return code_; }
-    const std::string& Path() const { return path_; }
     int Table() const { return table_; } ///< 0 when the file has one table
     int Line() const { return line_; }   ///< 0 when unknown
     /// The message of the standard exception the library's read ended with
@@ -55,11 +56,15 @@ public:
     const std::string& LibraryException() const { return libraryException_; }
 
 private:
-    int code_;
-    std::string path_;
     int table_;
     int line_;
     std::string libraryException_;
+};
+
+/// A table number the file has no table for.
+class NoSuchTable : public TableReadError {
+public:
+    using TableReadError::TableReadError;
 };
 
 /// The tables of chart text, in file order; at least one (text without any
@@ -119,10 +124,10 @@ private:
 
 /// Reads table `number` (1-based; 0 for DefaultTable) of the chart file at
 /// `utf8Path` (UTF-8) through the library. TableReadError when the file or the
-/// table cannot be read, or the file has no table of that number; the message
-/// says why in words with the result code, e.g. "FograStrip3.ti1, table 1
-/// (lines 1-95): the data format on line 17 names 8 different fields but
-/// NUMBER_OF_FIELDS on line 16 is 9 [code 5]".
+/// table cannot be read, NoSuchTable when the file has no table of that
+/// number; the message says why in words with the result code, e.g.
+/// "FograStrip3.ti1, table 1 (lines 1-95): the data format on line 17 names 8
+/// different fields but NUMBER_OF_FIELDS on line 16 is 9 [code 5]".
 LoadedTable LoadTable(const std::string& utf8Path, int number = 0);
 
 } // namespace swatchlog

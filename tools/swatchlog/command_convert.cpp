@@ -1,7 +1,6 @@
 // swatchlog convert: a clean CGATS file written from the chart by the library's
 // new-file writer, with everything it changes or drops listed.
 #include <algorithm>
-#include <array>
 #include <fstream>
 
 #include "chart_model.h"
@@ -35,20 +34,9 @@ const char* const kConvertHelp =
 
 namespace {
 
-// Keywords in the order a reader expects them; the rest follow in file order.
-constexpr std::array<const char*, 12> kLeadingKeywords{
-    "ORIGINATOR",   "FILE_DESCRIPTOR", "DESCRIPTOR",         "CREATED",
-    "MANUFACTURER", "MANUFACTURE",     "PROD_DATE",          "SERIAL",
-    "MATERIAL",     "INSTRUMENTATION", "MEASUREMENT_SOURCE", "PRINT_CONDITIONS"};
-
 // Keywords that describe spectral fields; they go when no spectra are written.
 bool AnnouncesSpectra(const std::string& key) {
     return key.rfind("SPECTRAL_", 0) == 0;
-}
-
-bool IsLeading(const std::string& key) {
-    return std::find(kLeadingKeywords.begin(), kLeadingKeywords.end(), key) !=
-           kLeadingKeywords.end();
 }
 
 struct KeywordPlan {
@@ -59,7 +47,6 @@ struct KeywordPlan {
 // The header lines of the chart as the file has them, values unchanged.
 KeywordPlan PlanKeywords(const Chart& chart, bool spectraWritten) {
     KeywordPlan plan;
-    plan.lines.emplace_back("CGATS.17", "");
     const std::string& identification = chart.Identification();
     if (identification.empty()) {
         plan.changes.push_back({"added", "the identification line CGATS.17"});
@@ -92,16 +79,16 @@ KeywordPlan PlanKeywords(const Chart& chart, bool spectraWritten) {
             kept.push_back(&line);
         }
     }
-    std::stable_partition(kept.begin(), kept.end(),
-                          [](const HeaderLine* line) { return IsLeading(line->key); });
-    std::vector<std::string> announced;
+    KeywordList keptLines;
     for (const HeaderLine* line : kept) {
-        if (!IsStandardKeyword(line->key) &&
-            std::find(announced.begin(), announced.end(), line->key) == announced.end()) {
-            plan.lines.emplace_back("KEYWORD", "\"" + line->key + "\"");
-            announced.push_back(line->key);
+        keptLines.emplace_back(line->key, line->value);
+    }
+    plan.lines = NewFileKeywordLines(std::move(keptLines));
+    std::vector<std::string> announced;
+    for (const auto& [key, value] : plan.lines) {
+        if (key == "KEYWORD") {
+            announced.push_back(Unquoted(value));
         }
-        plan.lines.emplace_back(line->key, line->value);
     }
     const auto list = [](const std::vector<std::string>& items) {
         std::string text;
@@ -296,7 +283,7 @@ int RunConvert(const Words& args, std::ostream& /*out*/, std::ostream& err) {
         throw ChartError(RepairUtf8(output) + ": " + DescribeLibraryException(error));
     }
     if (code != 0) {
-        throw ChartError(DefaultFailureText(output, chart.Name())(code));
+        throw DefaultFailureText(output, chart)(code);
     }
     if (keepIds) {
         RestoreSampleIds(chart, pending.TemporaryPath());

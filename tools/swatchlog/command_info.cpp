@@ -4,6 +4,7 @@
 #include "chart_model.h"
 #include "command_support.h"
 #include "commands.h"
+#include "device_space.h"
 #include "json_writer.h"
 #include "result_messages.h"
 #include "text_table.h"
@@ -24,25 +25,6 @@ const char* const kInfoHelp =
     "  --table N   the table to describe (default: the first with data rows)\n";
 
 namespace {
-
-std::string DeviceSpaceName(int space) {
-    switch (space) {
-    case COLORSPACE_CMYK:
-        return "CMYK";
-    case COLORSPACE_LAB:
-        return "L*a*b*";
-    case COLORSPACE_RGB:
-        return "RGB";
-    case COLORSPACE_CMYKOG:
-        return "six-colour CMYKOG";
-    case COLORSPACE_CMYKRGB:
-        return "CMYK+RGB";
-    case COLORSPACE_NCOLOR:
-        return "n-colour";
-    default:
-        return "none";
-    }
-}
 
 std::string Trimmed(std::string text) {
     text.erase(text.find_last_not_of(' ') + 1);
@@ -71,19 +53,9 @@ InfoFacts Gather(const Chart& chart) {
     facts.strips = store.GetNumberOfStrips();
     facts.columns = store.GetNumberOfCols();
     facts.pages = store.GetNumberOfPages();
-    facts.device = DeviceSpaceName(store.GetDeviceColorSpace());
-    facts.channels = store.GetDeviceChannelCount();
-    // A chart of spectra alone reports CMYK: the densities its patches derive
-    // are kept as CMYK. It has no device values.
-    // An HTML colour is reported as CMYK too.
-    if (store.GetDeviceColorSpace() == COLORSPACE_CMYK && !chart.FileHasField("CMYK_C")) {
-        const bool html = chart.Has(Space::Html);
-        facts.device = html ? "HTML colour" : "none";
-        facts.channels = html ? 3 : 0;
-    }
-    if (facts.device == "none") {
-        facts.channels = 0;
-    }
+    const DeviceSpace device = DescribeDevice(chart);
+    facts.device = device.name;
+    facts.channels = device.channels;
     try {
         facts.range = store.GetSpectralRange();
     } catch (const std::exception& error) {

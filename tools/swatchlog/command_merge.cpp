@@ -1,15 +1,10 @@
 // swatchlog merge: the measurements of one chart put into a target file.
 #include <charconv>
 
-#include "chart_model.h"
+#include "chart_writers.h"
 #include "command_support.h"
 #include "commands.h"
-#include "device_agreement.h"
-#include "file_paths.h"
-#include "number_format.h"
 #include "patch_pairing.h"
-#include "result_messages.h"
-#include "tool_error.h"
 #include "utf8_text.h"
 
 namespace swatchlog {
@@ -56,100 +51,6 @@ double ToleranceOption(const ParsedArguments& parsed) {
     return value;
 }
 
-// The measured patch of each target patch, by index; every target patch has one.
-std::vector<std::size_t> PartnerOfEachTarget(const Chart& target, const Chart& measured,
-                                             const Pairing& pairing, bool allowUnpaired) {
-    if (!pairing.unpairedFirst.empty()) {
-        throw ChartError(std::to_string(pairing.unpairedFirst.size()) + " of " +
-                         std::to_string(target.Patches().size()) + " patches of " + target.Name() +
-                         " (" + SamplesText(pairing.unpairedFirst) + ")" +
-                         (pairing.unpairedFirst.size() == 1 ? " has" : " have") +
-                         " no partner in " + measured.Name() + " by " + PairByText(pairing.by) +
-                         (pairing.fallback.empty() ? "" : " (" + pairing.fallback + ")") +
-                         "; every target patch needs a measurement, so nothing was written");
-    }
-    if (!pairing.unpairedSecond.empty() && !allowUnpaired) {
-        throw ChartError(std::to_string(pairing.unpairedSecond.size()) + " of " +
-                         std::to_string(measured.Patches().size()) + " patches of " +
-                         measured.Name() + " (" + SamplesText(pairing.unpairedSecond) + ")" +
-                         (pairing.unpairedSecond.size() == 1 ? " has" : " have") +
-                         " no partner in " + target.Name() + " by " + PairByText(pairing.by) +
-                         "; --allow-unpaired leaves them out of the merged file");
-    }
-    std::vector<std::size_t> partner(target.Patches().size());
-    for (const PatchPair& pair : pairing.pairs) {
-        partner[pair.first] = pair.second;
-    }
-    return partner;
-}
-
-template <typename Record, typename Get>
-std::vector<Record> Reordered(const Chart& measured, const std::vector<std::size_t>& partner,
-                              Space space, Get get) {
-    std::vector<Record> list;
-    for (const std::size_t index : partner) {
-        const CColorPatch& patch = measured.Patches()[index];
-        if (!Chart::PatchHas(patch, space)) {
-            throw ChartError("sample " + std::to_string(index + 1) + " of " + measured.Name() +
-                             " has no " + NameOf(space).title + "; nothing was written");
-        }
-        list.push_back(get(patch));
-    }
-    return list;
-}
-
-// Hands the measurements, in the target's patch order, to the target's chart
-// object, whose merge writers then rebuild the target file.
-void HandMeasurementsToStore(const Chart& target, const Chart& measured,
-                             const std::vector<std::size_t>& partner) {
-    CSwatchlogBase& store = target.Store();
-    if (measured.Has(Space::Spectral)) {
-        const auto spectra = measured.Store().GetSpectralDataList();
-        std::vector<std::map<std::string, double>> list;
-        for (const std::size_t index : partner) {
-            list.push_back(index < spectra.size() ? spectra[index]
-                                                  : std::map<std::string, double>());
-        }
-        // With computation on, the store also works out XYZ, L*a*b* and densities.
-        store.SetSpectralDataList(list, true);
-    }
-    if (measured.Has(Space::Xyz)) {
-        store.SetXYZList(Reordered<tagXYZ>(measured, partner, Space::Xyz,
-                                           [](const CColorPatch& p) { return p.GetXYZ(); }));
-    }
-    if (measured.Has(Space::Lab)) {
-        store.SetLABList(Reordered<tagLAB>(measured, partner, Space::Lab,
-                                           [](const CColorPatch& p) { return p.GetLAB(); }));
-    }
-}
-
-void CheckDevices(const Chart& target, const Chart& measured, const Pairing& pairing,
-                  double tolerance, std::ostream& err) {
-    const DeviceAgreement agreement = CheckDeviceValues(target, measured, pairing, tolerance);
-    if (agreement.space.empty()) {
-        err << "swatchlog merge: note: the device values were not compared: "
-            << RepairUtf8(target.Name()) << " and " << RepairUtf8(measured.Name())
-            << " carry none of the same kind\n";
-        return;
-    }
-    if (agreement.disagreements.empty()) {
-        return;
-    }
-    std::string text = std::to_string(agreement.disagreements.size()) + " of " +
-                       std::to_string(agreement.checked) + " pairs by " + PairByText(pairing.by) +
-                       " differ in their " + agreement.space + " values by more than " +
-                       FormatShortest(tolerance) + ": ";
-    const std::size_t shown = std::min<std::size_t>(agreement.disagreements.size(), 3);
-    for (std::size_t i = 0; i < shown; ++i) {
-        text += (i ? "; " : "") + agreement.disagreements[i];
-    }
-    if (agreement.disagreements.size() > shown) {
-        text += "; ...";
-    }
-    throw ChartError(RepairUtf8(text) + ". The measurements may belong to another chart, or "
-                                        "the pairing is wrong (--by, --device-tolerance)");
-}
-
 } // namespace
 
 int RunMerge(const Words& args, std::ostream& /*out*/, std::ostream& err) {
@@ -171,46 +72,16 @@ int RunMerge(const Words& args, std::ostream& /*out*/, std::ostream& err) {
     const std::string measuredPath = parsed.positionals[1];
     const std::string output = RequireOutputPath(parsed, {targetPath, measuredPath});
 
-    const Chart target = Chart::Load(targetPath, TableOption(parsed, "target-table"));
-    const Chart measured = Chart::Load(measuredPath, TableOption(parsed, "measured-table"));
-    if (!measured.Has(Space::Lab) && !measured.Has(Space::Xyz) && !measured.Has(Space::Spectral)) {
-        throw ChartError(measured.Name() + ": the chart holds no measurements "
-                                           "(no L*a*b*, XYZ or spectra)");
-    }
-    const Pairing pairing = PairPatches(target, measured, by);
-    const std::vector<std::size_t> partner =
-        PartnerOfEachTarget(target, measured, pairing, parsed.Has("allow-unpaired"));
-    CheckDevices(target, measured, pairing, tolerance, err);
-    HandMeasurementsToStore(target, measured, partner);
-    if (!pairing.fallback.empty()) {
-        err << "swatchlog merge: note: paired by " << PairByText(pairing.by) << " ("
-            << RepairUtf8(pairing.fallback) << ")\n";
-    }
-    if (!pairing.unpairedSecond.empty()) {
-        err << "swatchlog merge: note: left out " << pairing.unpairedSecond.size() << " of "
-            << measured.Patches().size() << " patches of " << RepairUtf8(measured.Name())
-            << " that have no target patch (" << SamplesText(pairing.unpairedSecond) << ")\n";
-    }
-    if (target.Loaded().Tables().size() > 1) {
-        err << "swatchlog merge: note: " << RepairUtf8(output) << " holds table "
-            << target.Loaded().Table().number << " of " << RepairUtf8(targetPath) << " alone\n";
-    }
-
-    const std::size_t targetCount = target.Patches().size();
-    const FailureText failure = DefaultFailureText(output, target.Name());
-    const bool appendMissing = parsed.Has("append-missing");
-    const bool exact = parsed.Has("exact");
-    WriteOutputFile(output, failure, [&](const std::wstring& temporary) {
-        CSwatchlogBase& store = target.Store();
-        const int code = appendMissing
-                             ? store.AppendMissingColumns(target.SourcePath(), temporary, exact)
-                             : store.WriteMeasurementFile(target.SourcePath(), temporary);
-        if (code == 0) {
-            RequirePatchCount(temporary, targetCount,
-                              "the merged file would hold a different number of patches than " +
-                                  target.Name());
-        }
-        return code;
+    MergeOptions options;
+    options.appendMissing = parsed.Has("append-missing");
+    options.exact = parsed.Has("exact");
+    options.by = by;
+    options.allowUnpaired = parsed.Has("allow-unpaired");
+    options.deviceTolerance = tolerance;
+    options.targetTable = TableOption(parsed, "target-table");
+    options.measuredTable = TableOption(parsed, "measured-table");
+    MergeMeasurements(targetPath, measuredPath, output, options, [&err](const std::string& text) {
+        err << "swatchlog merge: note: " << text << "\n";
     });
     return kExitSuccess;
 }

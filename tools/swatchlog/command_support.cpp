@@ -1,5 +1,6 @@
 #include "command_support.h"
 
+#include <exception>
 #include <memory>
 
 #include <redavudeva/redavudeva.h>
@@ -64,11 +65,20 @@ OutputFormat ParseFormat(const ParsedArguments& parsed, const std::vector<std::s
     return format;
 }
 
-FailureText DefaultFailureText(const std::string& outputPath, const std::string& sourcePath) {
-    return [outputPath, sourcePath](int code) {
-        const bool sourceFault = (code == 21 || code == 22) && !sourcePath.empty();
-        return RepairUtf8(sourceFault ? sourcePath : outputPath) + ": " +
-               WithCode(DescribeWriteResult(code), code);
+FailureText DefaultFailureText(const std::string& outputPath) {
+    return [outputPath](int code) {
+        return ChartError(RepairUtf8(outputPath) + ": " + WithCode(DescribeWriteResult(code), code),
+                          outputPath, code);
+    };
+}
+
+FailureText DefaultFailureText(const std::string& outputPath, const Chart& source) {
+    return [outputPath, name = source.Name(), path = source.Path()](int code) {
+        if (code == 21 || code == 22) {
+            return ChartError(name + ": " + WithCode(DescribeWriteResult(code), code), path, code);
+        }
+        return ChartError(RepairUtf8(outputPath) + ": " + WithCode(DescribeWriteResult(code), code),
+                          outputPath, code);
     };
 }
 
@@ -98,10 +108,12 @@ void WriteOutputFile(const std::string& outputPath, const FailureText& failure,
     } catch (const ChartError&) {
         throw;
     } catch (const std::exception& error) {
-        throw ChartError(RepairUtf8(outputPath) + ": " + DescribeLibraryException(error));
+        // The library's exception stays attached, for callers that tell its kind apart.
+        std::throw_with_nested(ChartError(
+            RepairUtf8(outputPath) + ": " + DescribeLibraryException(error), outputPath, 0));
     }
     if (code != 0) {
-        throw ChartError(failure(code));
+        throw failure(code);
     }
     pending.Commit();
 }

@@ -7,8 +7,11 @@
 
 #include "arguments.h"
 #include "text_table.h"
+#include "tool_error.h"
 
 namespace swatchlog {
+
+class Chart;
 
 /// UsageError unless the number of positionals lies within [minimum, maximum].
 void RequirePositionals(const ParsedArguments& parsed, std::size_t minimum, std::size_t maximum,
@@ -31,12 +34,16 @@ struct OutputFormat {
 OutputFormat ParseFormat(const ParsedArguments& parsed, const std::vector<std::string>& allowed);
 
 using WriteFunction = std::function<int(const std::wstring& temporaryPath)>;
-/// Turns a non-zero result code of a writer into the error message.
-using FailureText = std::function<std::string(int code)>;
+/// Turns a non-zero result code of a writer into the error, which names the
+/// file it blames and carries the code.
+using FailureText = std::function<ChartError(int code)>;
 
-/// The usual failure text: "FILE: reason [code N]", naming `sourcePath` for the
-/// codes that blame the source file (21, 22) and `outputPath` for the others.
-FailureText DefaultFailureText(const std::string& outputPath, const std::string& sourcePath);
+/// The usual failure of a writer without a source file: "OUT: reason [code N]".
+FailureText DefaultFailureText(const std::string& outputPath);
+/// The usual failure of a writer that re-reads the chart `source`: the codes
+/// that concern the source (21, 22) blame it (by its name, with the table),
+/// the others blame `outputPath`.
+FailureText DefaultFailureText(const std::string& outputPath, const Chart& source);
 
 /// Reads the written file at `libraryPath` back through the library and throws
 /// ChartError ("`problem`: it reads as N patches, not M") unless it reads with
@@ -47,7 +54,8 @@ void RequirePatchCount(const std::wstring& libraryPath, std::size_t expected,
 /// Writes `outputPath` whole or not at all: `write` gets a temporary path and
 /// answers the library's result code; a non-zero code, an exception or a
 /// failed rename throw ChartError and leave no trace of the output. A
-/// ChartError from `write` passes unchanged.
+/// ChartError from `write` passes unchanged; a library exception stays
+/// attached to the ChartError as its nested exception.
 void WriteOutputFile(const std::string& outputPath, const FailureText& failure,
                      const WriteFunction& write);
 

@@ -23,7 +23,7 @@ fs::path FileSystemPath(const std::string& utf8Path) {
 std::wstring LibraryPath(const std::string& utf8Path) {
     std::wstring wide;
     if (!WideFromUtf8(utf8Path, wide)) {
-        throw ChartError(RepairUtf8(utf8Path) + ": the file name is not valid UTF-8");
+        throw ChartError(RepairUtf8(utf8Path) + ": the file name is not valid UTF-8", utf8Path, 0);
     }
     return wide;
 }

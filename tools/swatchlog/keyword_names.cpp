@@ -3,9 +3,16 @@
 #include <algorithm>
 #include <array>
 #include <cctype>
+#include <utility>
 
 namespace swatchlog {
 namespace {
+
+// Keywords in the order a reader expects them; the rest follow in their own order.
+constexpr std::array<const char*, 12> kLeadingKeywords{
+    "ORIGINATOR",   "FILE_DESCRIPTOR", "DESCRIPTOR",         "CREATED",
+    "MANUFACTURER", "MANUFACTURE",     "PROD_DATE",          "SERIAL",
+    "MATERIAL",     "INSTRUMENTATION", "MEASUREMENT_SOURCE", "PRINT_CONDITIONS"};
 
 bool IsNumber(const std::string& text) {
     std::size_t i = (text[0] == '-' || text[0] == '+') ? 1 : 0;
@@ -66,6 +73,28 @@ std::string KeywordValueText(const std::string& value, bool& ok) {
         return "";
     }
     return "\"" + inner + "\"";
+}
+
+bool IsLeadingKeyword(const std::string& keyword) {
+    return std::find(kLeadingKeywords.begin(), kLeadingKeywords.end(), keyword) !=
+           kLeadingKeywords.end();
+}
+
+std::vector<std::pair<std::string, std::string>>
+NewFileKeywordLines(std::vector<std::pair<std::string, std::string>> keywords) {
+    std::stable_partition(keywords.begin(), keywords.end(),
+                          [](const auto& line) { return IsLeadingKeyword(line.first); });
+    std::vector<std::pair<std::string, std::string>> out{{"CGATS.17", ""}};
+    std::vector<std::string> announced;
+    for (auto& [key, value] : keywords) {
+        if (!IsStandardKeyword(key) &&
+            std::find(announced.begin(), announced.end(), key) == announced.end()) {
+            out.emplace_back("KEYWORD", "\"" + key + "\"");
+            announced.push_back(key);
+        }
+        out.emplace_back(std::move(key), std::move(value));
+    }
+    return out;
 }
 
 } // namespace swatchlog

@@ -3,6 +3,8 @@
 #pragma once
 
 #include <string>
+#include <utility>
+#include <vector>
 
 namespace swatchlog {
 
@@ -18,5 +20,16 @@ bool IsValidKeywordName(const std::string& keyword);
 /// double quotes. Empty when the value cannot be written (line breaks, or
 /// double quotes inside it).
 std::string KeywordValueText(const std::string& value, bool& ok);
+
+/// Whether `keyword` is one of the descriptive keywords a new file puts first
+/// (ORIGINATOR, DESCRIPTOR, CREATED, MANUFACTURER ... PRINT_CONDITIONS).
+bool IsLeadingKeyword(const std::string& keyword);
+/// The keyword lines of a new chart file from header lines (key, value as
+/// written): "CGATS.17" first, then the leading keywords, then the others, each
+/// group in the given order; a keyword the format does not define gets a
+/// KEYWORD declaration before its first line. The caller leaves out what may
+/// not be written (counts, comments, invalid names).
+std::vector<std::pair<std::string, std::string>>
+NewFileKeywordLines(std::vector<std::pair<std::string, std::string>> keywords);
 
 } // namespace swatchlog

@@ -15,7 +15,8 @@ std::string Reason(const std::error_code& error) {
 ChartError OutputError(const std::string& output, const std::string& reason,
                        const std::string& state) {
     return ChartError(RepairUtf8(output) + ": the output file cannot be written (" + reason + ")" +
-                      (state.empty() ? "" : "; " + state));
+                          (state.empty() ? "" : "; " + state),
+                      output, 0);
 }
 
 void ThrowUnlessWritten(const std::string& output, const it8::files::WriteResult& result) {
