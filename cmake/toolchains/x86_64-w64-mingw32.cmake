@@ -31,8 +31,10 @@ find_program(REDAVUDEVA_WINE NAMES wine64 wine PATHS /usr/lib/wine NO_DEFAULT_PA
 if(NOT REDAVUDEVA_WINE)
     find_program(REDAVUDEVA_WINE NAMES wine64 wine)
 endif()
+# Through a small script that tries a program once more when Wine fails to
+# start it at all.
 if(REDAVUDEVA_WINE)
-    set(CMAKE_CROSSCOMPILING_EMULATOR ${REDAVUDEVA_WINE})
+    set(CMAKE_CROSSCOMPILING_EMULATOR /bin/sh ${CMAKE_CURRENT_LIST_DIR}/wine_run.sh ${REDAVUDEVA_WINE})
 endif()
 
 # objdump of the cross binutils, for the export-table tests.
