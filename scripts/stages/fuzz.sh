@@ -50,22 +50,19 @@ for dir in examples tests/data /usr/share/color/argyll/ref /usr/share/colord/ti1
         -o -name '*.cie' -o -name '*.sp' \) -size -64k -exec cp --backup=numbered {} "$work/seeds/" \;
 done
 
-failed=()
-for target in fuzz_read_chart fuzz_source_writers fuzz_tokens; do
-    name="${target#fuzz_}"
-    binary="build/fuzz/fuzz/$target"
-    section "fuzz: $name"
-
-    regressions=(fuzz/regressions/"$name"/*)
+# Replays a target's saved crash inputs, then fuzzes it; prints what failed.
+fuzz_target() {
+    local name="$1"
+    local binary="build/fuzz/fuzz/fuzz_$name"
+    local regressions=(fuzz/regressions/"$name"/*)
     if [ -e "${regressions[0]}" ]; then
         echo "replaying ${#regressions[@]} saved crash input(s)"
         if ! "$binary" -timeout=10 -rss_limit_mb=2048 "${regressions[@]}"; then
-            failed+=("$name (regression)")
-            continue
+            echo "FAILED: $name (regression)"
+            return 1
         fi
     fi
-
-    seeds=("fuzz/corpus/$name")
+    local seeds=("fuzz/corpus/$name")
     if [ "$name" != tokens ]; then
         seeds+=("$work/seeds")
     fi
@@ -73,6 +70,35 @@ for target in fuzz_read_chart fuzz_source_writers fuzz_tokens; do
     if ! "$binary" -max_total_time="$seconds" -timeout=10 -rss_limit_mb=2048 -max_len=262144 \
         -print_final_stats=1 -artifact_prefix="$artifacts/$name-" \
         "$work/$name" "${seeds[@]}"; then
+        echo "FAILED: $name"
+        return 1
+    fi
+}
+
+# One target per core at a time (each is a single process), so that every
+# target gets its full time on a core of its own; each one's output is shown
+# whole when it ends.
+targets=(read_chart source_writers tokens)
+cores=$(nproc)
+for name in "${targets[@]}"; do
+    while [ "$(jobs -rp | wc -l)" -ge "$cores" ]; do
+        wait -n || true
+    done
+    (
+        status=0
+        fuzz_target "$name" >"$work/$name.log" 2>&1 || status=1
+        {
+            flock 9 # one target's output at a time
+            section "fuzz: $name"
+            cat "$work/$name.log"
+        } 9>"$work/print.lock"
+        echo "$status" >"$work/$name.status"
+    ) &
+done
+wait
+failed=()
+for name in "${targets[@]}"; do
+    if [ "$(cat "$work/$name.status" 2>/dev/null)" != 0 ]; then
         failed+=("$name")
     fi
 done
