@@ -110,8 +110,7 @@ public:
 
     /// Whether the patch's record lies on origin + t * direction within tolerance / 1e7.
     bool IsCMYKOnGradient(const tagCMYK& origin, const tagCMYK& direction, double tolerance);
-    bool IsCMYKOGOnGradient(const tagCMYKOG& origin, const tagCMYKOG& direction,
-                            double tolerance);
+    bool IsCMYKOGOnGradient(const tagCMYKOG& origin, const tagCMYKOG& direction, double tolerance);
     bool IsCMYKOGVOnGradient(const tagCMYKOGV& origin, const tagCMYKOGV& direction,
                              double tolerance);
     bool IsCMYKRGBOnGradient(const tagCMYKRGB& origin, const tagCMYKRGB& direction,

@@ -91,16 +91,16 @@ public:
                                             CColorPatch profileWhite) = 0;
     /// append false: new file from the store; true: template with appended columns.
     /// 0, 21, 23, 24.
-    virtual int WriteChartFile(std::wstring templatePath, std::wstring targetPath,
-                               bool append) = 0;
+    virtual int WriteChartFile(std::wstring templatePath, std::wstring targetPath, bool append) = 0;
     /// Rebuilds the source's data block with the store's measurements: 0, 21-24.
     virtual int WriteMeasurementFile(std::wstring sourcePath, std::wstring targetPath) = 0;
     /// Appends the colour spaces the source lacks and the store has: 0, 21-24.
     virtual int AppendMissingColumns(std::wstring sourcePath, std::wstring targetPath,
                                      bool exactCounts) = 0;
     /// Copies a chart file with keyword lines inserted after its identification: 0, 21, 23.
-    virtual int InsertKeywords(std::wstring sourcePath, std::wstring targetPath,
-                               const std::vector<std::pair<std::string, std::string>>& keywords) = 0;
+    virtual int
+    InsertKeywords(std::wstring sourcePath, std::wstring targetPath,
+                   const std::vector<std::pair<std::string, std::string>>& keywords) = 0;
     /// Always 1.
     virtual int CanReadFile(std::wstring path) = 0;
     /// Writes the source reduced to the store's clean and white patches: 0, 1, 21-24.
@@ -192,15 +192,12 @@ public:
     /// Writes the captured device-control lines: 0, or 23; base version 23.
     virtual int WriteDeviceControlSequence(std::string path);
     /// Patches on the straight gradient origin + t * direction.
-    virtual std::vector<CColorPatch> SelectCMYKRGBGradient(const tagCMYKRGB& origin,
-                                                           const tagCMYKRGB& direction,
-                                                           double tolerance);
-    virtual std::vector<CColorPatch> SelectCMYKOGGradient(const tagCMYKOG& origin,
-                                                          const tagCMYKOG& direction,
-                                                          double tolerance);
+    virtual std::vector<CColorPatch>
+    SelectCMYKRGBGradient(const tagCMYKRGB& origin, const tagCMYKRGB& direction, double tolerance);
+    virtual std::vector<CColorPatch>
+    SelectCMYKOGGradient(const tagCMYKOG& origin, const tagCMYKOG& direction, double tolerance);
     virtual std::vector<CColorPatch> SelectCMYKGradient(const tagCMYK& origin,
-                                                        const tagCMYK& direction,
-                                                        double tolerance);
+                                                        const tagCMYK& direction, double tolerance);
     /// Clean and white patches; true when nothing was found.
     virtual bool SelectCleanAndWhitePatches(std::vector<CColorPatch>& patchesOut,
                                             bool stopAtFirstWhite);
