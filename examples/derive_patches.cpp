@@ -33,8 +33,8 @@ void Show(const char* name, std::map<std::string, double> spectrum) {
     const tagDENSITY d = patch.GetDensity();
     std::printf("%-8s XYZ %6.2f %6.2f %6.2f  L*a*b* %6.2f %7.2f %7.2f  RGB %3d %3d %3d  "
                 "D(R,G,B,V) %.2f %.2f %.2f %.2f\n",
-                name, xyz.x, xyz.y, xyz.z, lab.l, lab.a, lab.b, rgb.r, rgb.g, rgb.b, d.red,
-                d.green, d.blue, d.visual);
+                name, xyz.x, xyz.y, xyz.z, lab.l, lab.a, lab.b, rgb.r, rgb.g, rgb.b, d.red, d.green,
+                d.blue, d.visual);
 }
 
 } // namespace

@@ -8,7 +8,9 @@ CSwatchlogFactory::CSwatchlogFactory() = default;
 
 CSwatchlogFactory::~CSwatchlogFactory() = default;
 
-CSwatchlogFactory& CSwatchlogFactory::operator=(const CSwatchlogFactory&) { return *this; }
+CSwatchlogFactory& CSwatchlogFactory::operator=(const CSwatchlogFactory&) {
+    return *this;
+}
 
 CSwatchlogBase* CSwatchlogFactory::GetReaderWriter(enumReaderwriterType type) {
     if (type != READERWRITER_IT8) {

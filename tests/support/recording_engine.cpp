@@ -36,10 +36,18 @@ bool record(Call call, const float* input, int inputCount, int startNm, int coun
 
 } // namespace
 
-void Reset() { state() = State{}; }
-const std::vector<Record>& Calls() { return state().calls; }
-void FailCall(int n) { state().failingCalls.insert(n); }
-void FailAll(Call call) { state().failingFunctions.insert(call); }
+void Reset() {
+    state() = State{};
+}
+const std::vector<Record>& Calls() {
+    return state().calls;
+}
+void FailCall(int n) {
+    state().failingCalls.insert(n);
+}
+void FailAll(Call call) {
+    state().failingFunctions.insert(call);
+}
 void SetXYZ(float x, float y, float z) {
     state().xyz[0] = x;
     state().xyz[1] = y;
