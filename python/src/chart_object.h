@@ -11,6 +11,8 @@
 #include <string>
 #include <vector>
 
+#include "chart_tables.h"
+
 namespace redavudeva_python {
 
 namespace py = pybind11;
@@ -26,21 +28,11 @@ struct FixedSpace {
 constexpr std::array<FixedSpace, 5> kFixedSpaces{
     {{"cmyk", 4}, {"rgb", 3}, {"xyz", 3}, {"lab", 3}, {"density", 4}}};
 
-/// One table of a chart file, as the tool lists it.
-struct TableInfo {
-    int number = 0;    ///< 1 for the file's first table
-    int firstLine = 0; ///< 1-based line numbers in the file, both included
-    int lastLine = 0;
-    int dataLine = 0;       ///< its BEGIN_DATA line, 0 when it has no data block
-    int rows = 0;           ///< data rows of its data block
-    py::tuple fields;       ///< data format names (str), upper case
-    py::str identification; ///< the word alone on its first line, "" when none
-};
-
 struct ChartObject {
-    py::object path = py::none();  ///< the file read, None for a chart built from arrays
-    std::vector<TableInfo> tables; ///< every table of the file read; empty for a built chart
-    int table = 0;                 ///< the number of the table read, 0 for a built chart
+    py::object path = py::none(); ///< the file read, None for a chart built from arrays
+    std::vector<swatchlog::TableExtent>
+        tables;    ///< every table of the file read; none for a built chart
+    int table = 0; ///< the number of the table read, 0 for a built chart
     py::array_t<std::int64_t> sampleNumbers;
     py::array sampleIds; ///< str array
     py::list names;

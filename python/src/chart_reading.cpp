@@ -188,26 +188,6 @@ void PutChannels(const CColorPatch& patch, std::size_t count, double* row) {
     std::copy(values.begin(), values.end(), row);
 }
 
-std::vector<TableInfo> TablesOf(const swatchlog::LoadedTable& table) {
-    std::vector<TableInfo> tables;
-    for (const auto& extent : table.Tables()) {
-        TableInfo info;
-        info.number = extent.number;
-        info.firstLine = extent.firstLine;
-        info.lastLine = extent.lastLine;
-        info.dataLine = extent.dataLine;
-        info.rows = extent.rowCount;
-        py::list fields;
-        for (const auto& field : extent.fields) {
-            fields.append(TextFromBytes(field));
-        }
-        info.fields = py::tuple(fields);
-        info.identification = TextFromBytes(extent.identification);
-        tables.push_back(std::move(info));
-    }
-    return tables;
-}
-
 // The file's SAMPLE_ID text of every patch, or the sample numbers as text when
 // the file has no SAMPLE_ID (or not one per patch).
 py::array SampleIdsOf(const swatchlog::LoadedTable& table, std::size_t count) {
@@ -224,7 +204,7 @@ ChartObject ChartFromTable(const swatchlog::LoadedTable& table) {
     const std::size_t count = patches.size();
     ChartObject out;
     out.path = TextFromBytes(table.Path());
-    out.tables = TablesOf(table);
+    out.tables = table.Tables();
     out.table = table.Table().number;
     out.sampleNumbers = SampleNumbers(count);
     out.sampleIds = SampleIdsOf(table, count);

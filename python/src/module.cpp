@@ -19,7 +19,7 @@
 namespace py = pybind11;
 using namespace pybind11::literals;
 using redavudeva_python::ChartObject;
-using redavudeva_python::TableInfo;
+using swatchlog::TableExtent;
 
 namespace {
 
@@ -197,35 +197,45 @@ PYBIND11_MODULE(_redavudeva, module) {
     module.doc() = kModuleDoc;
     redavudeva_python::RegisterChartError(module);
 
-    py::class_<TableInfo> table(module, "Table",
-                                "One table of a chart file: a header, a data format and a data "
-                                "block,\nended by its END_DATA. Chart.tables lists them.");
-    table.def_readonly("number", &TableInfo::number,
+    py::class_<TableExtent> table(module, "Table",
+                                  "One table of a chart file: a header, a data format and a data "
+                                  "block,\nended by its END_DATA. Chart.tables lists them.");
+    table.def_readonly("number", &TableExtent::number,
                        "The table's number in its file, 1 for the first (read(table=...)).");
-    table.def_readonly("first_line", &TableInfo::firstLine,
+    table.def_readonly("first_line", &TableExtent::firstLine,
                        "The table's first line in the file (counted from 1).");
-    table.def_readonly("last_line", &TableInfo::lastLine,
+    table.def_readonly("last_line", &TableExtent::lastLine,
                        "The table's last line in the file, its END_DATA line or the file's "
                        "end.");
     table.def_property_readonly(
         "data_line",
-        [](const TableInfo& t) {
+        [](const TableExtent& t) {
             return t.dataLine > 0 ? py::object(py::int_(t.dataLine)) : py::object(py::none());
         },
         "The line of its BEGIN_DATA, or None when it has no data block.");
-    table.def_readonly("rows", &TableInfo::rows, "The number of data rows in its data block.");
-    table.def_readonly("fields", &TableInfo::fields,
-                       "The data format's field names (tuple of str), upper case, in column "
-                       "order.");
-    table.def_readonly("identification", &TableInfo::identification,
-                       "The word alone on the table's first line (\"CGATS.17\", \"CTI3\", "
-                       "\"IT8.7/2\" ...),\nor \"\" when that line holds anything else.");
+    table.def_readonly("rows", &TableExtent::rowCount,
+                       "The number of data rows in its data block.");
+    table.def_property_readonly(
+        "fields",
+        [](const TableExtent& t) {
+            py::list fields;
+            for (const auto& field : t.fields) {
+                fields.append(redavudeva_python::TextFromBytes(field));
+            }
+            return py::tuple(fields);
+        },
+        "The data format's field names (tuple of str), upper case, in column order.");
+    table.def_property_readonly(
+        "identification",
+        [](const TableExtent& t) { return redavudeva_python::TextFromBytes(t.identification); },
+        "The word alone on the table's first line (\"CGATS.17\", \"CTI3\", \"IT8.7/2\" ...),\n"
+        "or \"\" when that line holds anything else.");
     table.def(
         "__repr__",
-        [](const TableInfo& t) {
+        [](const TableExtent& t) {
             return "<redavudeva.Table " + std::to_string(t.number) + ": lines " +
                    std::to_string(t.firstLine) + "-" + std::to_string(t.lastLine) + ", " +
-                   std::to_string(t.rows) + (t.rows == 1 ? " row" : " rows") + ", " +
+                   std::to_string(t.rowCount) + (t.rowCount == 1 ? " row" : " rows") + ", " +
                    std::to_string(t.fields.size()) + " fields>";
         },
         "Number, lines, rows and field count.");
