@@ -28,15 +28,6 @@ TEST_F(ToolTest, ConvertWritesACleanChartThatReadsBackWithTheSameValues) {
               "2\t2\tB\t0.00\t100.00\t0.00\t0.00\t48.00\t74.00\t-3.00\n");
 }
 
-TEST_F(ToolTest, MergePutsTheMeasurementsIntoTheTarget) {
-    dir.write("target.it8", kTarget);
-    dir.write("measured.it8", kMeasured);
-    // Options also come as --name=VALUE.
-    Ok({"merge", "target.it8", "measured.it8", "--output=merged.it8"});
-    ExpectIn(Tsv("merged.it8", "cmyk,lab"), {"\t100.00\t100.00\t0.00\t0.00\t24.00\t20.50\t-48.00\n",
-                                             "\t0.00\t0.00\t0.00\t0.00\t95.00\t0.75\t-2.00\n"});
-}
-
 TEST_F(ToolTest, MergePairsBySampleIdAndRefusesMeasurementsOfAnotherChart) {
     dir.write("target.it8", kTarget);
     // The measurements in another row order, with their device values; and one
@@ -79,8 +70,9 @@ TEST_F(ToolTest, MergePairsBySampleIdAndRefusesMeasurementsOfAnotherChart) {
         ExpectIn(run.err, {c.message});
         EXPECT_FALSE(std::filesystem::exists(dir.file("out.it8")));
     }
+    // Options also come as --name=VALUE.
     const RunResult run =
-        Tool({"merge", "target.it8", "reordered.it8", "--allow-unpaired", "-o", "merged.it8"});
+        Tool({"merge", "target.it8", "reordered.it8", "--allow-unpaired", "--output=merged.it8"});
     EXPECT_EQ(run.status, 0) << run.err;
     ExpectIn(run.err, {"left out 1 of 4 patches of reordered.it8 that have no target patch "
                        "(sample 3)"});
